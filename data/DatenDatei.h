@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QByteArray>
 #include <QString>
 
 struct InitMini;
@@ -15,7 +16,16 @@ struct LeseFehler {
 // Reads pfad into ziel. The data goes into separate storage first and replaces the roster,
 // services, pages, plan and settings of ziel only after the last line has been read, with
 // Sperre and Einsaetze reset to 0; on failure ziel is untouched and fehler says where.
+// A negative AnzahlTermine or MiniAnz means no entries and is stored as 0, so that no later
+// code indexes with it.
 [[nodiscard]] bool LeseDatei(const QString &pfad, InitMini &ziel, LeseFehler *fehler = nullptr);
+
+// LeseDatei on the bytes of a whole file already in memory.
+[[nodiscard]] bool LeseDaten(const QByteArray &inhalt, InitMini &ziel, LeseFehler *fehler = nullptr);
+
+// The bytes of the data file for daten, appended to ziel. Fails when a text holds a character
+// outside Windows-1252 or a count does not fit the arrays it counts.
+[[nodiscard]] bool SchreibeDaten(const InitMini &daten, QByteArray &ziel, QString *fehler = nullptr);
 
 // Writes daten to pfad through a temporary file in the same folder that replaces pfad only when
 // everything was written: a failure never damages an existing file. Fails also when a text holds
