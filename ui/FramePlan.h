@@ -7,6 +7,9 @@ class Meldungen;
 class Hauptfenster;
 class PlanGenerator;
 class Uhr;
+class QLabel;
+class QLineEdit;
+class QPushButton;
 
 // The panel "Plan erstellen": two dates, "Erstellen", "Abbrechen" and the progress caption.
 class FramePlan : public QGroupBox
@@ -18,4 +21,21 @@ public:
 
     // Menu "&Plan erstellen ...".
     void MnuPlanErstellen_Click();
+
+private:
+    void TxtDatum_Change();
+    void BtnErstellen_Click();
+    void BtnAbbruch3_Click();
+    void ZeigeFortschritt(int prozent);
+
+    Meldungen &m_meldungen;
+    Hauptfenster &m_hauptfenster;
+    PlanGenerator &m_generator;
+    const Uhr &m_uhr;
+
+    QLineEdit *m_txtStartDatum = nullptr;
+    QLineEdit *m_txtEndDatum = nullptr;
+    QPushButton *m_btnErstellen = nullptr;
+    QPushButton *m_btnAbbruch3 = nullptr;
+    QLabel *m_panelPlanAnzeige = nullptr;
 };
