@@ -3,6 +3,7 @@
 #include "data/Meldungen.h"
 #include "data/Uhr.h"
 #include "output/TextExport.h"
+#include "ui/FormDrucken.h"
 #include "ui/FormEinstellungen.h"
 #include "ui/FormFileBrw.h"
 #include "ui/FormInfo.h"
@@ -485,10 +486,13 @@ void FormMinis::HilfeZurHilfe()
 
 void FormMinis::Drucken()
 {
-    // The print dialog (FormDrucken) plugs in here.
+    if (auto *dialog = FormDrucken::Laden(m_daten, m_umgebung.meldungen, m_umgebung.uhr))
+        ZeigeSekundaer(dialog, Knopf::Print);
 }
 
 void FormMinis::AlsPdfSpeichern()
 {
-    // The print dialog in its PDF mode plugs in here.
+    const QString pfad = PfadNebenDatei(m_daten.Dateiname, QStringLiteral("PLAN.PDF"));
+    if (auto *dialog = FormDrucken::Laden(m_daten, m_umgebung.meldungen, m_umgebung.uhr, pfad))
+        ZeigeSekundaer(dialog, Knopf::Print);
 }
