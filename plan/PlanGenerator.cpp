@@ -31,6 +31,23 @@ int16_t TageDazwischen(const QDate &von, const QDate &bis)
     return static_cast<int16_t>(tage);
 }
 
+// Sorts the ranges from index ab on and joins those that overlap or touch: only whether a day
+// lies in any of them matters, not which one comes first.
+template<typename Spanne>
+void VereinigeSpannen(std::vector<Spanne> &spannen, std::size_t ab)
+{
+    std::sort(spannen.begin() + std::ptrdiff_t(ab), spannen.end(),
+              [](const Spanne &a, const Spanne &b) { return a.von < b.von; });
+    std::size_t ziel = ab;
+    for (std::size_t i = ab; i < spannen.size(); ++i) {
+        if (ziel > ab && spannen[i].von <= spannen[ziel - 1].bis + 1)
+            spannen[ziel - 1].bis = std::max(spannen[ziel - 1].bis, spannen[i].bis);
+        else
+            spannen[ziel++] = spannen[i];
+    }
+    spannen.resize(ziel);
+}
+
 // Sets the flag for as long as a computation runs, so the selection rules keep their caches.
 class Lauf
 {
@@ -210,6 +227,8 @@ void PlanGenerator::bereiteMinisVor()
     m_termineEnde.assign(std::size_t(n), TermineEnde::Gut);
     m_familieNach.clear();
     m_familien.clear();
+    m_familienSchluessel.clear();
+    m_familieVon.assign(std::size_t(n), -1);
     m_eintraegeFehlen = false;
 
     for (int i = 0; i < n; ++i) {
@@ -252,15 +271,21 @@ void PlanGenerator::bereiteMinisVor()
                 m_spannen.push_back({int32_t(von->toJulianDay()), int32_t(bis->toJulianDay())});
         }
 
+        VereinigeSpannen(m_spannen, m_spanneAb[std::size_t(i)]);
+
         const std::pair<QString, QString> schluessel(mini.Name, mini.Strasse);
         auto it = m_familieNach.constFind(schluessel);
         if (it == m_familieNach.cend()) {
             it = m_familieNach.insert(schluessel, int(m_familien.size()));
             m_familien.emplace_back();
+            m_familienSchluessel.push_back(schluessel);
         }
         m_familien[std::size_t(*it)].push_back(int16_t(i));
+        m_familieVon[std::size_t(i)] = *it;
     }
     m_spanneAb[std::size_t(n)] = uint32_t(m_spannen.size());
+    m_zeiger.assign(m_spanneAb.begin(), m_spanneAb.end() - 1);
+    m_zeigerTag = LLONG_MIN;
     m_zustand.assign(std::size_t(n), Zustand::Frei);
     m_zustandGueltig = false;
     m_minisBereit = true;
@@ -271,28 +296,29 @@ void PlanGenerator::berechneTagesZustand()
     if (!m_minisBereit)
         bereiteMinisVor();
     const qint64 tag = AktDatum.toJulianDay();
+    // The days of a computation only grow, so each server's cursor into its sorted ranges only
+    // moves forward; a step back (calls from outside a computation) starts the cursors afresh.
+    if (tag < m_zeigerTag)
+        std::copy(m_spanneAb.begin(), m_spanneAb.end() - 1, m_zeiger.begin());
+    m_zeigerTag = tag;
     const uint8_t wochentagBit = uint8_t(1u << WochentagVon(AktDatum));
     for (int i = 0; i < m_anzahl; ++i) {
         const std::size_t s = std::size_t(i);
+        const uint32_t ende = m_spanneAb[s + 1];
+        uint32_t &zeiger = m_zeiger[s];
+        while (zeiger < ende && m_spannen[zeiger].bis < tag)
+            ++zeiger;
+        const bool inSpanne = zeiger < ende && m_spannen[zeiger].von <= tag;
+
         Zustand z = Zustand::Frei;
-        if (m_termineEnde[s] == TermineEnde::KeinEintrag) {
+        if (m_termineEnde[s] == TermineEnde::KeinEintrag)
             z = Zustand::Fehler;
-        } else if (m_wochentage[s] & wochentagBit) {
+        else if ((m_wochentage[s] & wochentagBit) || inSpanne)
             z = Zustand::Gesperrt;
-        } else {
-            const Spanne *sp = m_spannen.data() + m_spanneAb[s];
-            const Spanne *ende = m_spannen.data() + m_spanneAb[s + 1];
-            for (; sp != ende; ++sp) {
-                if (sp->von <= tag && tag <= sp->bis)
-                    break;
-            }
-            if (sp != ende)
-                z = Zustand::Gesperrt;
-            else if (m_termineEnde[s] == TermineEnde::Fehler)
-                z = Zustand::Fehler;
-            else if (m_nichtEinteilen[s])
-                z = Zustand::Gesperrt;
-        }
+        else if (m_termineEnde[s] == TermineEnde::Fehler)
+            z = Zustand::Fehler;
+        else if (m_nichtEinteilen[s])
+            z = Zustand::Gesperrt;
         m_zustand[s] = z;
     }
     m_zustandTag = tag;
@@ -378,6 +404,10 @@ void PlanGenerator::waehleMini(int p)
     const bool geschwister = d.Geschwister && p > 1 && waehleGeschwister();
     if (!geschwister)
         Wahl = zufallsIndex(d.AnzahlMinis);
+    if (ohnePruefungen()) {
+        sucheSchnell();
+        return;
+    }
     ermittleMinimum();
 
     RingZaehler = Wahl;
@@ -394,6 +424,74 @@ void PlanGenerator::waehleMini(int p)
     }
 }
 
+// Whether every index the search can reach is valid, so the search may skip the index checks.
+bool PlanGenerator::ohnePruefungen()
+{
+    const int n = d.AnzahlMinis;
+    if (n <= 0 || Wahl < 0 || Wahl >= n || d.Sperre.size() < std::size_t(n) || d.Einsaetze.size() < std::size_t(n))
+        return false;
+    if (!m_minisBereit || !m_zustandGueltig || m_zustandTag != AktDatum.toJulianDay())
+        berechneTagesZustand();
+    return true;
+}
+
+// ErmittleMinimum and the ring scan on today's states, with the same steps, results and
+// point of failure, but without a call, an index check or a division per server.
+void PlanGenerator::sucheSchnell()
+{
+    const int n = d.AnzahlMinis;
+    const Zustand *zustand = m_zustand.data();
+    const int16_t *sperre = d.Sperre.data();
+    const int16_t *einsaetze = d.Einsaetze.data();
+
+    int wahl = Wahl;
+    int zaehler = 0;
+    int ring = 0;
+    int16_t minimum = 0;
+    gefunden = false;
+    // Leaves the selection state as the plain search would have it at its failing check.
+    auto scheitere = [&](bool imRing) {
+        Wahl = int16_t(wahl);
+        Zaehler = int16_t(zaehler);
+        Minimum = minimum;
+        if (imRing)
+            RingZaehler = int16_t(ring);
+        throw Laufzeitfehler("Kein Datum");
+    };
+
+    while (zaehler < n) {
+        ++zaehler;
+        const Zustand z = zustand[wahl];
+        if (z == Zustand::Fehler)
+            scheitere(false);
+        if (z == Zustand::Frei && sperre[wahl] <= 0) {
+            minimum = einsaetze[wahl];
+            gefunden = true;
+            break;
+        }
+        wahl = wahl + 1 == n ? 0 : wahl + 1;
+    }
+
+    ring = wahl;
+    while (zaehler < n) {
+        ++zaehler;
+        ring = ring + 1 == n ? 0 : ring + 1;
+        const Zustand z = zustand[ring];
+        if (z == Zustand::Frei) {
+            if (sperre[ring] <= 0 && einsaetze[ring] < minimum) {
+                wahl = ring;
+                minimum = einsaetze[ring];
+            }
+        } else if (z == Zustand::Fehler) {
+            scheitere(true);
+        }
+    }
+    Wahl = int16_t(wahl);
+    Zaehler = int16_t(zaehler);
+    RingZaehler = int16_t(ring);
+    Minimum = minimum;
+}
+
 // Starts the search at a random sibling (same Name and Strasse as the server assigned last) if
 // one of them is eligible.
 bool PlanGenerator::waehleGeschwister()
@@ -402,10 +500,17 @@ bool PlanGenerator::waehleGeschwister()
         bereiteMinisVor();
     if (m_eintraegeFehlen)
         throw Laufzeitfehler("Index");   // collecting reads the name of every server
-    const auto it = m_familieNach.constFind(std::pair<QString, QString>(MemName, MemStrasse));
-    if (it == m_familieNach.cend())
-        return false;
-    const std::vector<int16_t> &familie = m_familien[std::size_t(*it)];
+    // MemName and MemStrasse normally are those of Wahl, whose family is known; look them up only
+    // when they were set otherwise.
+    int familienIndex = Wahl >= 0 && Wahl < m_anzahl ? m_familieVon[std::size_t(Wahl)] : -1;
+    if (familienIndex < 0 || m_familienSchluessel[std::size_t(familienIndex)].first != MemName
+        || m_familienSchluessel[std::size_t(familienIndex)].second != MemStrasse) {
+        const auto it = m_familieNach.constFind(std::pair<QString, QString>(MemName, MemStrasse));
+        if (it == m_familieNach.cend())
+            return false;
+        familienIndex = *it;
+    }
+    const std::vector<int16_t> &familie = m_familien[std::size_t(familienIndex)];
     int16_t kandidaten[MaxGeschwister];
     int n = 0;
     for (const int16_t i : familie) {
@@ -443,6 +548,13 @@ void PlanGenerator::BucheEinsatz()
 
 void PlanGenerator::ZaehleSperreHerunter()
 {
+    if (d.Sperre.size() >= std::size_t(std::max<int>(d.AnzahlMinis, 0))) {
+        for (auto s = d.Sperre.begin(), ende = s + std::max<int>(d.AnzahlMinis, 0); s != ende; ++s) {
+            if (*s > 0)
+                --*s;
+        }
+        return;
+    }
     for (int i = 0; i < d.AnzahlMinis; ++i) {
         int16_t &s = sperre(i);
         if (s > 0)

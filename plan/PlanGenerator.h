@@ -67,6 +67,8 @@ private:
     void ermittleMinimum();
     void waehleMini(int p);
     bool waehleGeschwister();
+    bool ohnePruefungen();
+    void sucheSchnell();
     int16_t zufallsIndex(int n);
     int16_t einsaetze(int i) const;
     int16_t &sperre(int i);
@@ -92,11 +94,15 @@ private:
     std::vector<uint8_t> m_wochentage;        // bit d: Ausgenommen(d)
     std::vector<uint8_t> m_nichtEinteilen;
     std::vector<uint32_t> m_spanneAb;         // m_spannen[m_spanneAb[i] .. m_spanneAb[i+1])
-    std::vector<Spanne> m_spannen;            // readable ranges before the first unreadable entry
+    std::vector<Spanne> m_spannen;            // readable ranges before the first unreadable entry, joined
+    std::vector<uint32_t> m_zeiger;           // per server: first range not ending before m_zeigerTag
+    qint64 m_zeigerTag = 0;
     std::vector<TermineEnde> m_termineEnde;
     bool m_eintraegeFehlen = false;
     QHash<std::pair<QString, QString>, int> m_familieNach;   // (Name, Strasse) -> m_familien index
     std::vector<std::vector<int16_t>> m_familien;            // members in index order
+    std::vector<std::pair<QString, QString>> m_familienSchluessel;
+    std::vector<int> m_familieVon;                           // per server
 
     bool m_zustandGueltig = false;
     qint64 m_zustandTag = 0;
