@@ -142,25 +142,15 @@ TEST(DatenDatei, LiestJedesFeldAnSeinePlatz)
     LeseFehler fehler;
     ASSERT_TRUE(LeseDatei(Testdatei("zwei-minis-ausnahme-plan.prd"), d, &fehler)) << fehler.grund.toStdString();
 
-    const InitMini e = ZweiMinis();
-    ASSERT_EQ(d.Minis.size(), 3u);
-    EXPECT_EQ(d.Minis[0].Ort, e.Minis[0].Ort);
-    EXPECT_EQ(d.Minis[0].Telefon, e.Minis[0].Telefon);
-    EXPECT_EQ(d.Minis[1].Name, " Meier, \"Sepp\" ");
-    EXPECT_TRUE(d.Minis[0].Ausgenommen[1]);
-    EXPECT_FALSE(d.Minis[0].Ausgenommen[2]);
-    EXPECT_TRUE(d.Minis[1].NichtEinteilen);
-    EXPECT_TRUE(d.Minis[0].Termine[2].isEmpty());
+    InitMini erwartet = ZweiMinis();
+    erwartet.Minis[0].Termine[2].clear();   // beyond the count: not in the file
+    EXPECT_EQ(Bytes(d), Bytes(erwartet));
+    EXPECT_EQ(d.Minis.size(), 3u);
     EXPECT_EQ(d.Sperre, std::vector<int16_t>(3, 0));
     EXPECT_EQ(d.Einsaetze, std::vector<int16_t>(3, 0));
     EXPECT_EQ(d.Ausnahmen.size(), 2u);
     EXPECT_EQ(d.Plan.size(), 3u);
-    EXPECT_TRUE(d.Plan[0].Name[1].isEmpty());
-    EXPECT_EQ(d.Intervall, 3);
-    EXPECT_FALSE(d.Geschwister);
-    InitMini ohneRest = e;
-    ohneRest.Minis[0].Termine[2].clear();
-    EXPECT_EQ(Bytes(d), Bytes(ohneRest));
+    EXPECT_TRUE(d.Minis[0].Ausgenommen[1] && d.Minis[0].Ausgenommen[7] && !d.Minis[0].Ausgenommen[2]);
 
     EXPECT_EQ(d.Wochentag[1], "So");
     EXPECT_EQ(d.TagesZeit[2], "8.00");
@@ -199,7 +189,7 @@ TEST(DatenDatei, ZeilenendenUndLetzteZeile)
     EXPECT_EQ(d.Regulaer[1].Zeit[0], "a\rb");
 }
 
-TEST(DatenDatei, ZahlzeilenMitLeerraumUndVorzeichen)
+TEST(DatenDatei, ZahlUndFlagZeilen)
 {
     const QByteArray leer = Inhalt(Testdatei("leer-62-zeilen.prd"));
     for (const char *zeile : {"2", "  2  ", "\t+2\t", "0002", " 2"}) {
@@ -215,6 +205,14 @@ TEST(DatenDatei, ZahlzeilenMitLeerraumUndVorzeichen)
     InitMini d;
     ASSERT_TRUE(LeseDaten(negativ, d));
     EXPECT_EQ(d.Intervall, -32768);
+
+    // Only exactly "T" is true.
+    for (const char *zeile : {"t", "T ", " T", "Ja", ""}) {
+        QByteArray b = leer;
+        b.replace(b.size() - 3, 1, zeile);
+        ASSERT_TRUE(LeseDaten(b, d)) << zeile;
+        EXPECT_FALSE(d.Geschwister) << zeile;
+    }
 }
 
 TEST(DatenDatei, GrenzenDerTermineUndPlaetze)
