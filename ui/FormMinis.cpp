@@ -271,8 +271,10 @@ void FormMinis::setzeMenueaktion(const QString &name, bool an)
 
 void FormMinis::setzeMenue(const QString &name, bool an)
 {
+    // The menu itself, not only its entry in the menu bar: a menu re-enables its entry whenever
+    // its own enabled state changes, which happens each time the main window is enabled again.
     if (auto *m = findChild<QMenu *>(name))
-        m->menuAction()->setEnabled(an);
+        m->setEnabled(an);
 }
 
 Werkzeugknopf &FormMinis::knopf(Knopf k) const

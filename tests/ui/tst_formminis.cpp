@@ -408,6 +408,13 @@ void TestFormMinis::sekundaerfensterBleibtBedienbarUndJedesSchliessenStelltHer()
 {
     Testumgebung t;
     auto f = NeuesHauptfenster(t);
+    // Enabling the main window again must not enable the menus that were off.
+    f->Einstellungen();
+    OffenesFenster<FormEinstellungen>()->close();
+    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
+    QVERIFY(!MenueAn(*f, "MnuAusführen"));
+    QVERIFY(MenueAn(*f, "MnuDatei"));
+
     f->Daten().AnzahlMinis = 1;
     f->Daten().AnzahlPlanEintraege = 1;
     f->MenueAktivieren();
