@@ -26,6 +26,11 @@ const std::vector<Befehl> &AlleBefehle()
          PlanTextBefehl},
         {"addresses-text", "addresses-text FILE [-o PATH]",
          "Schreibt die Adressliste als ADRESS.TXT neben FILE (oder nach PATH).", AdressenTextBefehl},
+        {"print", "print FILE --pdf OUT [--font NAME] [--size N] [--spacing S] [--no-addresses] [--no-plan]",
+         "Druckt Adressliste und Plan wie \"Drucken ...\" als A4-PDF nach OUT. Voreinstellungen: die\n"
+         "erste Schriftart, Größe 12, Zeilenabstand 1, beide Dokumente. Kann OUT nicht geschrieben\n"
+         "werden, bleibt eine alte Datei unverändert (Rückgabe 5).",
+         DruckBefehl},
     };
     return befehle;
 }

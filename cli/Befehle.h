@@ -41,6 +41,7 @@ int SaveBefehl(const QStringList &argumente);
 int PlanBefehl(const QStringList &argumente);
 int PlanTextBefehl(const QStringList &argumente);
 int AdressenTextBefehl(const QStringList &argumente);
+int DruckBefehl(const QStringList &argumente);
 
 // Message boxes of the core as lines "title: text" on standard error; every question is
 // answered with Yes or OK.

@@ -1,4 +1,5 @@
 #include "cli/Befehle.h"
+#include "cli/DruckBefehl.h"
 
 #include <QCoreApplication>
 
@@ -33,7 +34,7 @@ bool IstHilfe(const QString &arg)
 
 int main(int argc, char *argv[])
 {
-    QCoreApplication app(argc, argv);
+    const auto app = NeueAnwendung(argc, argv);
     QStringList argumente = QCoreApplication::arguments().mid(1);
     if (argumente.isEmpty()) {
         SchreibeFehler(Uebersicht());
