@@ -26,6 +26,13 @@ bool istRoot(const QString &pfad)
     return pfad.endsWith(QLatin1Char('/')) || pfad.endsWith(QLatin1Char('\\'));
 }
 
+// "*.*" means every file, also one without an extension, as on the systems the data files
+// come from.
+QString qtMuster(const QString &muster)
+{
+    return muster == QLatin1String("*.*") ? QStringLiteral("*") : muster;
+}
+
 bool hatMuster(const QString &name)
 {
     return name.contains(QLatin1Char('*')) || name.contains(QLatin1Char('?')) || name.contains(QLatin1Char('['));
@@ -96,7 +103,7 @@ std::optional<QString> FindeDatei(const QString &ordner, const QString &name)
             return name;
     }
     const QStringList treffer =
-        dir.entryList(QStringList{name}, QDir::Files | QDir::Hidden | QDir::System, QDir::Name | QDir::IgnoreCase);
+        dir.entryList(QStringList{qtMuster(name)}, QDir::Files | QDir::Hidden | QDir::System, QDir::Name | QDir::IgnoreCase);
     if (treffer.isEmpty())
         return std::nullopt;
     return treffer.front();
@@ -322,7 +329,7 @@ void FormFileBrw::setzeMuster(const QString &muster)
 {
     const bool neu = muster != m_muster;
     m_muster = muster;
-    m_dateiModell->setNameFilters(QStringList{muster});
+    m_dateiModell->setNameFilters(QStringList{qtMuster(muster)});
     if (neu)
         FileList_PatternChange();
 }
