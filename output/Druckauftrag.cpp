@@ -76,7 +76,8 @@ void Druckauftrag::bereiteVor(DruckEinstellungen &einstellungen)
     m_hoehe = float(m_drucker.seitenHoehe());
     m_links = m_breite / 10;
     m_oben = m_hoehe / 40;
-    const float abstand = float(ZahlWert(einstellungen.zeilenabstand));
+    // Clamped only so that an absurd typed spacing stays a number in single precision.
+    const float abstand = float(std::clamp(ZahlWert(einstellungen.zeilenabstand), -1e6, 1e6));
 
     double groesse = ZahlWert(einstellungen.schriftgroesse);
     if (!(groesse >= 8 && groesse <= 20)) {

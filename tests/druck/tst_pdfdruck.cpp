@@ -43,17 +43,6 @@ QString SeitenText(const QString &pdf, int seite)
 class PdfDruckTest : public ::testing::Test
 {
 protected:
-    static void SetUpTestSuite()
-    {
-        if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
-            qputenv("QT_QPA_PLATFORM", "offscreen");
-        static int argc = 1;
-        static char name[] = "tst_pdfdruck";
-        static char *argv[] = {name, nullptr};
-        if (!QGuiApplication::instance())
-            new QGuiApplication(argc, argv);
-    }
-
     void SetUp() override
     {
         ASSERT_TRUE(m_ordner.isValid());
@@ -219,3 +208,13 @@ TEST_F(PdfDruckTest, MeasuresInDevicePixelsOfAnA4Page)
 }
 
 } // namespace
+
+// Fonts need a QGuiApplication for the whole run.
+int main(int argc, char **argv)
+{
+    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    QGuiApplication app(argc, argv);
+    ::testing::InitGoogleTest(&argc, argv);
+    return RUN_ALL_TESTS();
+}
