@@ -393,3 +393,8 @@ void FrameGodi::SortiereTermin(int L, int R)
     if (i < R)
         SortiereTermin(i, R);
 }
+
+QSize FrameGodi::sizeHint() const
+{
+    return QGroupBox::sizeHint().expandedTo(QSize(613, 369));
+}

@@ -121,6 +121,10 @@ void FrameMinis::baueSeite()
     m_checkTag[7] = haken("CheckSamstag", QStringLiteral("Samstag"));
     m_checkTag[1] = haken("CheckSonntag", QStringLiteral("Sonntag"));
     auto *label2 = beschriftung("Label2", QStringLiteral("Weitere Termine, die ausgenommen werden:"));
+    // The two group captions are the widest texts of the page: with a large font they break
+    // into two lines rather than widen the page beyond the main window.
+    label1->setWordWrap(true);
+    label2->setWordWrap(true);
 
     m_cmbTermine = new QComboBox(this);
     m_cmbTermine->setObjectName(QStringLiteral("CmbTermine"));
@@ -203,8 +207,8 @@ void FrameMinis::baueSeite()
     rechts->addStretch(1);
 
     auto *haupt = new QHBoxLayout(this);
-    haupt->addLayout(links, 1);
-    haupt->addSpacing(16);
+    haupt->addLayout(links, 0);
+    haupt->addSpacing(12);
     haupt->addLayout(rechts, 1);
 
     QWidget *reihenfolge[] = {m_txtName, m_txtVorname, m_txtStrasse, m_txtOrt, m_txtTelefon, m_checkOmi,
@@ -597,4 +601,9 @@ bool FrameMinis::eventFilter(QObject *objekt, QEvent *ereignis)
         }
     }
     return QGroupBox::eventFilter(objekt, ereignis);
+}
+
+QSize FrameMinis::sizeHint() const
+{
+    return QGroupBox::sizeHint().expandedTo(QSize(613, 369));
 }

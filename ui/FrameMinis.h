@@ -27,6 +27,9 @@ public:
     // A data file was loaded: the working copy starts empty with the new size.
     void DatenGeladen();
 
+    // The designed size, so the page keeps its arrangement wherever there is room for it.
+    QSize sizeHint() const override;
+
     // The page's procedures and its working copy, public so tests can follow what a click did.
     void AnzeigeDaten();
     void LadeDaten();

@@ -110,3 +110,8 @@ void FramePlan::BtnAbbruch3_Click()
     hide();
     m_hauptfenster.MenueAktivieren();
 }
+
+QSize FramePlan::sizeHint() const
+{
+    return QGroupBox::sizeHint().expandedTo(QSize(377, 213));
+}

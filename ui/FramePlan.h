@@ -22,6 +22,9 @@ public:
     // Menu "&Plan erstellen ...".
     void MnuPlanErstellen_Click();
 
+    // The designed size, so the page keeps its arrangement wherever there is room for it.
+    QSize sizeHint() const override;
+
 private:
     void TxtDatum_Change();
     void BtnErstellen_Click();

@@ -11,6 +11,10 @@
 
 SeitenHauptfenster::SeitenHauptfenster()
 {
+    // The main window writes its own text in bold, and its pages inherit that font.
+    QFont schrift = font();
+    schrift.setBold(true);
+    setFont(schrift);
     resize(640, 420);
 }
 
@@ -76,7 +80,11 @@ QStringList abgeschnitteneBeschriftungen(const QWidget *wurzel)
 {
     QStringList zuKlein;
     for (const QLabel *l : wurzel->findChildren<QLabel *>()) {
-        if (!l->text().isEmpty() && l->isVisibleTo(wurzel) && l->width() < l->sizeHint().width())
+        if (l->text().isEmpty() || !l->isVisibleTo(wurzel))
+            continue;
+        const bool passt = l->wordWrap() ? l->height() >= l->heightForWidth(l->width())
+                                         : l->width() >= l->sizeHint().width();
+        if (!passt)
             zuKlein << l->objectName();
     }
     for (const QAbstractButton *k : wurzel->findChildren<QAbstractButton *>()) {

@@ -9,8 +9,8 @@
 
 class QAbstractButton;
 
-// A stand-in for the main window: a plain window that holds one page below a toolbar-high strip
-// and records the calls that switch the menus.
+// A stand-in for the main window: a plain window in the main window's bold font that holds one
+// page below a toolbar-high strip and records the calls that switch the menus.
 class SeitenHauptfenster : public QWidget, public Hauptfenster
 {
 public:
