@@ -63,7 +63,7 @@ FormPlan::FormPlan(const InitMini &daten, QWidget *parent)
     layout->setContentsMargins(8, 8, 8, 8);
     layout->addWidget(listPlan, 1);
     layout->addWidget(btnOK, 0, Qt::AlignHCenter);
-    resize(306, 383);
+    resize(sizeHint());
 
     const int n = daten.AnzahlPlanEintraege - 1;
     if (n >= 0) {
@@ -72,4 +72,9 @@ FormPlan::FormPlan(const InitMini &daten, QWidget *parent)
         listPlan->addItems(PlanZeilen(daten));
     }
     btnOK->setFocus();
+}
+
+QSize FormPlan::sizeHint() const
+{
+    return QSize(306, 383);
 }

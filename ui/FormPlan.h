@@ -11,4 +11,7 @@ class FormPlan : public QWidget
     Q_OBJECT
 public:
     explicit FormPlan(const InitMini &daten, QWidget *parent = nullptr);
+
+    // The designed client area; the window opener sizes the window by it.
+    QSize sizeHint() const override;
 };
