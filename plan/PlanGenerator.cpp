@@ -13,7 +13,7 @@
 
 namespace {
 
-// Names per service: the entry has 41 places.
+// The table of sibling candidates of one selection holds 11 servers.
 constexpr int MaxGeschwister = 11;
 
 void ZeigeFehler(Meldungen &meldungen)
@@ -71,6 +71,7 @@ PlanGenerator::Ergebnis PlanGenerator::BtnErstellen_Click(const QString &startTe
 {
     m_minisBereit = false;
     m_zustandGueltig = false;
+    m_planBegonnen = false;
     Lauf lauf(m_imLauf);
     try {
         AktDatum = LeseDatumOderFehler(startText);
@@ -98,7 +99,7 @@ PlanGenerator::Ergebnis PlanGenerator::BtnErstellen_Click(const QString &startTe
         }
 
         d.AnzahlPlanEintraege = 0;
-        d.Plan.clear();
+        m_planBegonnen = true;
         d.Plan.reserve(std::size_t(dauer + 1) * 4);
         m_zufall.starte(static_cast<uint32_t>(uhr.jetzt().time().msecsSinceStartOfDay()));
 
@@ -114,12 +115,30 @@ PlanGenerator::Ergebnis PlanGenerator::BtnErstellen_Click(const QString &startTe
             if (fortschritt)
                 fortschritt(static_cast<int>(100 * erledigt / basis));
         }
+        d.Plan.resize(std::size_t(d.AnzahlPlanEintraege));
         d.Geaendert = true;
         return Ergebnis::Fertig;
     } catch (const Laufzeitfehler &) {
+        if (m_planBegonnen)
+            d.Plan.resize(std::size_t(d.AnzahlPlanEintraege));
         ZeigeFehler(meldungen);
         return Ergebnis::Fehler;
     }
+}
+
+// The entry at index AnzahlPlanEintraege - 1. Entries of the previous plan are reused rather
+// than destroyed and built again, which is most of the cost of a plan for a small roster.
+PlanEintrag &PlanGenerator::neuerEintrag()
+{
+    const std::size_t index = std::size_t(d.AnzahlPlanEintraege - 1);
+    if (index >= d.Plan.size())
+        return d.Plan.emplace_back();
+    PlanEintrag &e = d.Plan[index];
+    for (int j = 0, alt = std::clamp<int>(e.MiniAnz, 0, MaxPlaetze); j < alt; ++j) {
+        e.Name[std::size_t(j)].clear();
+        e.Vorname[std::size_t(j)].clear();
+    }
+    return e;
 }
 
 void PlanGenerator::planeTag()
@@ -137,7 +156,7 @@ void PlanGenerator::planeTag()
         if (anzahl > MaxPlaetze)
             throw Laufzeitfehler("Zu viele Plätze");
         d.AnzahlPlanEintraege = eintraege;
-        PlanEintrag &eintrag = d.Plan.emplace_back();
+        PlanEintrag &eintrag = neuerEintrag();
         eintrag.Datum = datumText;
         eintrag.Wochentag = d.Wochentag[wochentag];
         eintrag.Zeit = d.TagesZeit[k];

@@ -10,6 +10,7 @@
 #include <vector>
 
 struct InitMini;
+struct PlanEintrag;
 class Meldungen;
 class Uhr;
 class Zufall;
@@ -74,6 +75,7 @@ private:
     int16_t &sperre(int i);
 
     void planeTag();
+    PlanEintrag &neuerEintrag();
     void leseTagesdienste();
     int sucheAusnahme() const;
 
@@ -89,6 +91,7 @@ private:
     // computed is read once; the state of every server for AktDatum is worked out once per day.
     // Sperre is always read live.
     bool m_imLauf = false;
+    bool m_planBegonnen = false;
     bool m_minisBereit = false;
     int m_anzahl = 0;
     std::vector<uint8_t> m_wochentage;        // bit d: Ausgenommen(d)

@@ -360,3 +360,41 @@ TEST_F(Erstellen, IntervalCountsServicesAcrossDaysAndCountersCarryOver)
 }
 
 } // namespace
+
+namespace {
+
+TEST_F(Erstellen, ANewPlanKeepsNothingOfTheOldOne)
+{
+    d = Gemeinde(6);
+    SetzeJedenTag(d, {"4", "2"});
+    zufallVorrat();
+    ASSERT_EQ(erstelle(QStringLiteral("01.03.2027"), QStringLiteral("03.03.2027")), PlanGenerator::Ergebnis::Fertig);
+    ASSERT_EQ(d.Plan.size(), 6u);
+
+    // Fewer servers and a shorter period: places that held names before must come out empty.
+    for (int i = 2; i < 6; ++i)
+        d.Minis[std::size_t(i)].NichtEinteilen = true;
+    SetzeJedenTag(d, {"1", "4"});
+    zufallVorrat();
+    ASSERT_EQ(erstelle(QStringLiteral("01.03.2027"), QStringLiteral("02.03.2027")), PlanGenerator::Ergebnis::Fertig);
+    ASSERT_EQ(d.AnzahlPlanEintraege, 4);
+    EXPECT_EQ(d.Plan.size(), 4u);
+    for (int e = 0; e < 4; ++e) {
+        const PlanEintrag &p = d.Plan[std::size_t(e)];
+        int besetzt = 0;
+        for (int k = 0; k < MaxPlaetze; ++k)
+            besetzt += !p.Name[std::size_t(k)].isEmpty() + !p.Vorname[std::size_t(k)].isEmpty();
+        EXPECT_LE(besetzt, 2 * 2) << e;
+        EXPECT_TRUE(p.Name[2].isEmpty() && p.Name[3].isEmpty()) << e;
+    }
+
+    // A failing computation leaves exactly the entries it made.
+    d.Minis[0].Termine[0] = QStringLiteral("kaputt");
+    d.Minis[0].AnzahlTermine = 1;
+    zufallVorrat();
+    ASSERT_EQ(erstelle(QStringLiteral("01.03.2027"), QStringLiteral("02.03.2027")), PlanGenerator::Ergebnis::Fehler);
+    EXPECT_EQ(d.AnzahlPlanEintraege, 1);
+    EXPECT_EQ(d.Plan.size(), 1u);
+}
+
+} // namespace
