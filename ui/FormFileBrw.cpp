@@ -5,6 +5,7 @@
 
 #include <QComboBox>
 #include <QDir>
+#include <QEvent>
 #include <QFileInfo>
 #include <QFileSystemModel>
 #include <QGridLayout>
@@ -13,6 +14,8 @@
 #include <QLineEdit>
 #include <QListView>
 #include <QPushButton>
+#include <QScrollBar>
+#include <QTimer>
 #include <QTreeView>
 #include <QVBoxLayout>
 
@@ -214,6 +217,18 @@ FormFileBrw::FormFileBrw(InitMini &daten, Meldungen &meldungen, DateiProzeduren 
             [this](const QModelIndex &aktuell) { DirList_Change(aktuell); });
     connect(m_txtDatei, &QLineEdit::textChanged, this, &FormFileBrw::TxtDatei_Change);
     connect(m_driveList, &QComboBox::currentIndexChanged, this, &FormFileBrw::DriveList_Change);
+    // The tree fills and sorts itself in the background, which moves the rows; until the user
+    // touches the tree, the open folder is kept in view.
+    m_nachfuehren = new QTimer(this);
+    m_nachfuehren->setSingleShot(true);
+    m_nachfuehren->setInterval(0);
+    connect(m_nachfuehren, &QTimer::timeout, this, [this] {
+        m_dirList->scrollTo(m_dirList->currentIndex(), QAbstractItemView::PositionAtCenter);
+    });
+    connect(m_ordnerModell, &QAbstractItemModel::layoutChanged, m_nachfuehren, qOverload<>(&QTimer::start));
+    connect(m_ordnerModell, &QAbstractItemModel::rowsInserted, m_nachfuehren, qOverload<>(&QTimer::start));
+    m_dirList->viewport()->installEventFilter(this);
+    m_dirList->verticalScrollBar()->installEventFilter(this);
 
     // Form_Load: the first drive at its root, the data file pattern, then the format list.
     waehleLaufwerk(0);
@@ -237,6 +252,16 @@ void FormFileBrw::showEvent(QShowEvent *event)
         m_aktiviert = true;
         FormActivate();
     }
+}
+
+bool FormFileBrw::eventFilter(QObject *objekt, QEvent *event)
+{
+    const auto art = event->type();
+    if (art == QEvent::MouseButtonPress || art == QEvent::Wheel || art == QEvent::KeyPress) {
+        m_ordnerModell->disconnect(m_nachfuehren);
+        m_nachfuehren->stop();
+    }
+    return QDialog::eventFilter(objekt, event);
 }
 
 void FormFileBrw::FormActivate()
@@ -275,7 +300,7 @@ void FormFileBrw::oeffneOrdner(const QString &ordner)
     for (QModelIndex oben = index.parent(); oben.isValid(); oben = oben.parent())
         m_dirList->expand(oben);
     m_dirList->setCurrentIndex(index);
-    m_dirList->scrollTo(index);
+    m_dirList->scrollTo(index, QAbstractItemView::PositionAtCenter);
     // setCurrentIndex reports no change when the index was current already.
     if (m_pfad != QDir::cleanPath(ordner))
         DirList_Change(index);

@@ -17,6 +17,7 @@ class QLineEdit;
 class QListView;
 class QModelIndex;
 class QPushButton;
+class QTimer;
 class QTreeView;
 
 // The main window's Laden and Speichern with their window parts, which the browser runs on OK.
@@ -50,6 +51,7 @@ public:
 
 protected:
     void showEvent(QShowEvent *event) override;
+    bool eventFilter(QObject *objekt, QEvent *event) override;
 
 private:
     void FormActivate();
@@ -87,4 +89,5 @@ private:
     QComboBox *m_driveList;
     QPushButton *m_cmdOK;
     QPushButton *m_cmdAbbruch;
+    QTimer *m_nachfuehren;
 };

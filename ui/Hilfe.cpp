@@ -1,8 +1,10 @@
 #include "ui/Hilfe.h"
 
 #include <QFileInfo>
+#include <QGuiApplication>
 #include <QHBoxLayout>
 #include <QPushButton>
+#include <QScreen>
 #include <QTextBrowser>
 #include <QUrl>
 #include <QVBoxLayout>
@@ -71,6 +73,10 @@ void HilfeFenster::baueFenster()
     layout->addLayout(knoepfe);
     layout->addWidget(m_browser);
     m_fenster->resize(640, 560);
+    if (QScreen *bildschirm = QGuiApplication::primaryScreen()) {
+        const QRect f = bildschirm->availableGeometry();
+        m_fenster->move(f.x() + (f.width() - m_fenster->width()) / 2, f.y() + (f.height() - m_fenster->height()) / 2);
+    }
 }
 
 void HilfeFenster::zeige(const QString &anker)
