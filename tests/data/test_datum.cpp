@@ -4,23 +4,20 @@
 
 #include <gtest/gtest.h>
 
-TEST(LeseDatum, KurzeUndLangeFormen)
+TEST(LeseDatum, KurzeUndLangeFormenUndDieJahrhundertgrenze)
 {
-    EXPECT_EQ(LeseDatum("3.10.2002"), QDate(2002, 10, 3));
-    EXPECT_EQ(LeseDatum("03.10.02"), QDate(2002, 10, 3));
-    EXPECT_EQ(LeseDatum("1.2.03"), QDate(2003, 2, 1));
-    EXPECT_EQ(LeseDatum(" \t24.12.2002 \t"), QDate(2002, 12, 24));
-    EXPECT_EQ(LeseDatum("29.2.2004"), QDate(2004, 2, 29));
-    EXPECT_EQ(LeseDatum("1.1.0001"), QDate(1, 1, 1));
-    EXPECT_EQ(LeseDatum("31.12.9999"), QDate(9999, 12, 31));
-}
-
-TEST(LeseDatum, ZweistelligeJahreWechselnBei30)
-{
-    EXPECT_EQ(LeseDatum("1.1.00"), QDate(2000, 1, 1));
-    EXPECT_EQ(LeseDatum("1.1.29"), QDate(2029, 1, 1));
-    EXPECT_EQ(LeseDatum("1.1.30"), QDate(1930, 1, 1));
-    EXPECT_EQ(LeseDatum("1.1.99"), QDate(1999, 1, 1));
+    const struct {
+        const char *text;
+        QDate datum;
+    } faelle[] = {
+        {"3.10.2002", {2002, 10, 3}}, {"03.10.02", {2002, 10, 3}}, {"1.2.03", {2003, 2, 1}},
+        {" \t24.12.2002 \t", {2002, 12, 24}}, {"29.2.2004", {2004, 2, 29}}, {"1.1.0001", {1, 1, 1}},
+        {"31.12.9999", {9999, 12, 31}}, {"1.1.00", {2000, 1, 1}}, {"1.1.29", {2029, 1, 1}},
+        {"1.1.30", {1930, 1, 1}}, {"1.1.99", {1999, 1, 1}},
+    };
+    for (const auto &f : faelle)
+        EXPECT_EQ(LeseDatum(f.text), f.datum) << f.text;
+    EXPECT_EQ(LeseDatumOderFehler("1.2.2003"), QDate(2003, 2, 1));
 }
 
 TEST(LeseDatum, AllesAndereIstKeinDatum)
@@ -33,21 +30,14 @@ TEST(LeseDatum, AllesAndereIstKeinDatum)
         EXPECT_EQ(LeseDatum(QString::fromUtf8(text)), std::nullopt) << text;
     }
     EXPECT_THROW(LeseDatumOderFehler("31.02.2003"), Laufzeitfehler);
-    EXPECT_EQ(LeseDatumOderFehler("1.2.2003"), QDate(2003, 2, 1));
 }
 
-TEST(DatumText, ImmerZweistelligUndVierstellig)
+TEST(DatumText, ZweistelligVierstelligUndSonntagIstEins)
 {
     EXPECT_EQ(DatumText(QDate(2002, 10, 3)), "03.10.2002");
     EXPECT_EQ(DatumText(QDate(999, 1, 9)), "09.01.0999");
     EXPECT_EQ(DatumText(QDate()), "");
-    EXPECT_EQ(DatumText(*LeseDatum("1.8.02")), "01.08.2002");
-}
-
-TEST(WochentagVon, SonntagIstEins)
-{
     EXPECT_EQ(WochentagVon(QDate(2002, 12, 22)), 1);   // Sonntag
     EXPECT_EQ(WochentagVon(QDate(2002, 12, 23)), 2);
-    EXPECT_EQ(WochentagVon(QDate(2002, 12, 25)), 4);   // Mittwoch
     EXPECT_EQ(WochentagVon(QDate(2002, 12, 28)), 7);   // Samstag
 }
