@@ -7,6 +7,7 @@
 #include "ui/Umgebung.h"
 
 #include <QApplication>
+#include <QWindow>
 
 int main(int argc, char *argv[])
 {
@@ -25,6 +26,9 @@ int main(int argc, char *argv[])
 
     // The info window comes first; it names the help file and shows the main window below it.
     auto *info = new FormInfo(haupt, hilfe, umgebung.programmOrdner);
+    info->winId();
+    if (info->windowHandle() && haupt.windowHandle())
+        info->windowHandle()->setTransientParent(haupt.windowHandle());
     info->show();
     info->raise();
     info->activateWindow();
