@@ -437,9 +437,12 @@ void TestFormMinis::sekundaerfensterBleibtBedienbarUndJedesSchliessenStelltHer()
     QTest::mouseClick(f->findChild<QWidget *>("ImSearchUp"), Qt::LeftButton);
     einstellungen = OffenesFenster<FormEinstellungen>();
     QVERIFY(einstellungen);
+    weg = einstellungen;
     QTest::keyClick(einstellungen, Qt::Key_Escape);
     QVERIFY(f->isEnabled());
     QCOMPARE(SichtbaresBild(*f, "Search"), QString("Up"));
+    Aufraeumen();
+    QVERIFY(weg.isNull());
 
     // The browser restores the title and resets its flag when it closes.
     f->Daten().Dateiname = t.pfad("neu.prd");
