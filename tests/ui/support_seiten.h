@@ -1,33 +1,18 @@
 #pragma once
 
-#include "ui/Hauptfenster.h"
+#include "support_umgebung.h"
+#include "ui/FormMinis.h"
 
+#include <QAbstractButton>
+#include <QCheckBox>
 #include <QComboBox>
 #include <QLineEdit>
-#include <QStringList>
-#include <QWidget>
+#include <QMenu>
+#include <QTest>
 
-class QAbstractButton;
+#include <memory>
 
-// A stand-in for the main window: a plain window in the main window's bold font that holds one
-// page below a toolbar-high strip and records the calls that switch the menus.
-class SeitenHauptfenster : public QWidget, public Hauptfenster
-{
-public:
-    SeitenHauptfenster();
-
-    void MenueAktivieren() override { aufrufe << QStringLiteral("MenueAktivieren"); }
-    void MenueDeaktivieren() override { aufrufe << QStringLiteral("MenueDeaktivieren"); }
-
-    // Places the page where the main window puts its frames (613 x 369 pixels below the toolbar).
-    void nimmSeite(QWidget *seite);
-
-    QStringList aufrufe;
-};
-
-// The named child of the given type; ends the test program when it is missing, because every
-// later step would only fail the same way.
-template <class T>
+template <class T = QWidget>
 T *kind(const QObject *eltern, const QString &name)
 {
     T *w = eltern->findChild<T *>(name);
@@ -36,14 +21,62 @@ T *kind(const QObject *eltern, const QString &name)
     return w;
 }
 
-// Replaces the text of a box as a user does: select everything, then type.
-void tippe(QLineEdit *feld, const QString &text);
-void tippe(QComboBox *liste, const QString &text);
-void drueckeEnter(QComboBox *liste);
-// Picks entry index from the opened list with the mouse.
-void waehleEintrag(QComboBox *liste, int index);
-void klicke(QAbstractButton *knopf);
-QStringList eintraege(const QComboBox *liste);
+// Base of the page tests: a fresh main window for each test; the helpers act on the page in seite.
+class Seitentest : public QObject
+{
+protected:
+    std::unique_ptr<Testumgebung> t;
+    std::unique_ptr<FormMinis> f;
+    QWidget *seite = nullptr;
 
-// Captions of labels, buttons and check boxes below wurzel that their widget cuts off.
-QStringList abgeschnitteneBeschriftungen(const QWidget *wurzel);
+    // A fresh main window, after the one of the test before is gone.
+    void starte(const QString &seitenname)
+    {
+        f.reset();
+        Aufraeumen();
+        t = std::make_unique<Testumgebung>();
+        f = NeuesHauptfenster(*t);
+        seite = kind(f.get(), seitenname);
+    }
+    InitMini &d() { return f->Daten(); }
+    // The main window's menus are off while a page is open.
+    bool menueAn() const { return kind<QMenu>(f.get(), QStringLiteral("MnuDatei"))->menuAction()->isEnabled(); }
+    QString text(const QString &feld) const { return kind<QLineEdit>(seite, feld)->text(); }
+    // Replaces the text of a line edit or combo box as a user does: select all, then type.
+    void tipp(const QString &feld, const QString &text)
+    {
+        auto *liste = qobject_cast<QComboBox *>(kind(seite, feld));
+        QLineEdit *zeile = liste ? liste->lineEdit() : kind<QLineEdit>(seite, feld);
+        zeile->selectAll();
+        if (text.isEmpty())
+            QTest::keyClick(zeile, Qt::Key_Delete);
+        // QTest::keyClicks takes ASCII only; other characters arrive as key events carrying their text.
+        for (const QChar c : text) {
+            const char16_t code = c.toUpper().unicode();
+            QTest::sendKeyEvent(QTest::Click, zeile, code <= 0xFF ? Qt::Key(code) : Qt::Key_unknown, QString(c), {});
+        }
+    }
+    void klick(const QString &knopf)
+    {
+        auto *k = kind<QAbstractButton>(seite, knopf);
+        // A check box stretched by its layout reacts only on its box and caption.
+        QTest::mouseClick(k, Qt::LeftButton, {}, qobject_cast<QCheckBox *>(k) ? QPoint(8, k->height() / 2) : QPoint());
+    }
+    // "title: text" of every message box shown.
+    QStringList meldungen() const
+    {
+        QStringList l;
+        for (const auto &m : t->meldungen.gezeigt())
+            l << m.titel + QStringLiteral(": ") + m.text;
+        return l;
+    }
+    // The named controls in the wrong state: those in aus enabled, those in an disabled.
+    QStringList falschGeschaltet(const QStringList &aus, const QStringList &an) const
+    {
+        QStringList falsch;
+        for (const QString &n : aus + an)
+            if (kind(seite, n)->isEnabled() != an.contains(n))
+                falsch << n;
+        return falsch;
+    }
+};
