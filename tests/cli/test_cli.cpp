@@ -1,8 +1,5 @@
-// pradilon-cli end to end: commands, messages, files and exit codes.
+// pradilon-cli end to end on temporary files: commands, messages, files and exit codes.
 
-#include "Programme.h"
-
-#include "data/Cp1252.h"
 #include "data/DatenDatei.h"
 #include "data/InitMini.h"
 #include "output/TextExport.h"
@@ -11,277 +8,168 @@
 #include "support/TestMeldungen.h"
 #include "support/TestUhr.h"
 
-#include <QDate>
 #include <QDir>
 #include <QFile>
+#include <QProcess>
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
 
+void PrintTo(const QString &text, std::ostream *os) { *os << '"' << text.toStdString() << '"'; }   // readable
+
 namespace {
 
 const QString Beispiel = QStringLiteral(PRADILON_QUELLEN "/examples/beispiel.prd");
-const QString LadeFehler = QStringLiteral(
-    "Fehler beim Öffnen: Dies ist keine Pradilon-Datei! Die Datei konnte nicht geöffnet werden! \n");
 
-QByteArray Kodiert(const QStringList &zeilen)
+struct Lauf {
+    int code = -1;
+    QString aus, fehler;   // standard output and error, UTF-8
+};
+
+QByteArray Lies(const QString &pfad)
 {
-    QByteArray b;
-    for (const QString &z : zeilen) {
-        EXPECT_TRUE(KodiereCp1252(z, b));
-        b += "\r\n";
-    }
-    return b;
+    QFile f(pfad);
+    return f.open(QIODevice::ReadOnly) ? f.readAll() : QByteArray("<fehlt>");
 }
 
 struct Cli : ::testing::Test {
     QTemporaryDir ordner;
+    const QString datei = pfad("gemeinde.prd");
 
+    Cli()   // the sample parish as gemeinde.prd
+    {
+        EXPECT_TRUE(QFile::copy(Beispiel, datei));
+        QFile(datei).setPermissions(QFile::ReadOwner | QFile::WriteOwner);
+    }
     QString pfad(const char *name) const { return ordner.filePath(QString::fromUtf8(name)); }
-    Lauf cli(const QStringList &argumente) const
-    {
-        return Starte(QStringLiteral(PRADILON_CLI), argumente, ordner.path());
-    }
-    // The sample parish copied into the temporary folder.
-    QString beispiel() const
-    {
-        const QString ziel = pfad("gemeinde.prd");
-        QFile::remove(ziel);
-        EXPECT_TRUE(QFile::copy(Beispiel, ziel));
-        QFile(ziel).setPermissions(QFile::ReadOwner | QFile::WriteOwner);
-        return ziel;
-    }
-    QString schreibe(const char *name, const InitMini &d) const
-    {
-        EXPECT_TRUE(SchreibeDatei(pfad(name), d));
-        return pfad(name);
-    }
-    InitMini lade(const QString &datei) const
-    {
-        InitMini d;
-        EXPECT_TRUE(LeseDatei(datei, d));
-        return d;
-    }
     QStringList dateien() const { return QDir(ordner.path()).entryList(QDir::Files, QDir::Name); }
+    Lauf cli(const QStringList &argumente, const QString &programm = QStringLiteral(PRADILON_CLI)) const
+    {
+        QProcess p;
+        p.setWorkingDirectory(ordner.path());
+        p.start(programm, argumente);
+        if (!p.waitForFinished(60000) || p.exitStatus() != QProcess::NormalExit)
+            return {};
+        return {p.exitCode(), QString::fromUtf8(p.readAllStandardOutput()),
+                QString::fromUtf8(p.readAllStandardError())};
+    }
+    InitMini gemeinde;   // gemeinde.prd as loaded
+    void lade() { ASSERT_TRUE(LeseDatei(datei, gemeinde)); }
 };
 
 TEST_F(Cli, HelpForTheToolAndEveryCommand)
 {
-    for (const char *schalter : {"--help", "-h"}) {
-        const Lauf l = cli({QString::fromLatin1(schalter)});
+    const Lauf hilfe = cli({"--help"});
+    EXPECT_EQ(hilfe.code, 0);
+    for (const char *aufruf : {"info FILE", "save FILE OUT", "plan FILE START END [--seed N] [-o OUT]",
+                               "plan-text FILE [-o PATH]", "addresses-text FILE [-o PATH]"}) {
+        EXPECT_TRUE(hilfe.aus.contains(QStringLiteral("pradilon-cli ") + QLatin1String(aufruf))) << aufruf;
+        const Lauf l = cli({QString::fromLatin1(aufruf).section(u' ', 0, 0), "x.prd", "--help"});
         EXPECT_EQ(l.code, 0);
-        EXPECT_TRUE(l.fehler.isEmpty());
-        for (const char *aufruf : {"info FILE", "save FILE OUT", "plan FILE START END [--seed N] [-o OUT]",
-                                   "plan-text FILE [-o PATH]", "addresses-text FILE [-o PATH]"})
-            EXPECT_TRUE(l.aus.contains(QStringLiteral("pradilon-cli ") + QString::fromLatin1(aufruf))) << aufruf;
+        EXPECT_TRUE(l.aus.startsWith("Aufruf: pradilon-cli " + QLatin1String(aufruf) + "\n\n")) << aufruf;
     }
-    for (const char *befehl : {"info", "save", "plan", "plan-text", "addresses-text"}) {
-        const Lauf l = cli({QString::fromLatin1(befehl), QStringLiteral("x.prd"), QStringLiteral("--help")});
-        EXPECT_EQ(l.code, 0) << befehl;
-        EXPECT_TRUE(l.aus.startsWith(QStringLiteral("Aufruf: pradilon-cli ") + QString::fromLatin1(befehl) + u' '))
-            << befehl;
-        EXPECT_GT(l.aus.count(u'\n'), 2);
-    }
-    EXPECT_TRUE(dateien().isEmpty());
 }
 
-TEST_F(Cli, WrongUsageExits64WithTheUsage)
+TEST_F(Cli, FailuresExitWithTheirCodeAndMessageAndWriteNothing)
 {
-    const QString datei = beispiel();
-    const QList<QStringList> faelle = {
-        {},
-        {"drucken", datei},
-        {"info"},
-        {"info", datei, datei},
-        {"save", datei},
-        {"plan", datei, "01.01.2027"},
-        {"plan", datei, "01.01.2027", "02.01.2027", "--seed"},
-        {"plan", datei, "01.01.2027", "02.01.2027", "--seed", "sieben"},
-        {"plan", datei, "01.01.2027", "02.01.2027", "--seed", "-1"},
-        {"plan", datei, "01.01.2027", "02.01.2027", "--tage", "3"},
-        {"plan-text", datei, "-o"},
-        {"addresses-text", datei, "--seed", "1"},
-    };
-    const QByteArray vorher = LiesDatei(datei);
-    for (const QStringList &argumente : faelle) {
+    ASSERT_TRUE(QFile::copy(QStringLiteral(PRADILON_QUELLEN "/CMakeLists.txt"), pfad("kaputt.prd")));
+    const QString neu = pfad("neu.prd"), fehlt = pfad("fehlt/neu.prd");
+    const QString sichern = "Fehler beim Sichern: Dateiname oder Pfadangabe ungültig! Datei konnte nicht "
+                            "gesichert werden.\n";
+    QList<std::tuple<QStringList, int, QString>> faelle = {
+        {{"plan", datei, "02.03.2027", "01.03.2027", "-o", neu}, 2, "Fehler im Datum: Datum wurde falsch angegeben!\n"},
+        {{"plan", datei, "01.01.2027", "02.01.2028", "-o", neu}, 2,
+         "Planberechnung: Sie wollen einen Plan der Dauer  366 Tage berechnen. Ist dies korrekt?\nZeitspanne zu "
+         "groß: Planberechnung über ein Jahr macht keinen Sinn! \r\r\nBitte wählen Sie die Zeitspanne kleiner!\n"},
+        {{"plan", datei, "1. März", "01.03.2027", "-o", neu}, 3,
+         "Fehler bei der Planberechnung: Fehler unbekannten Typs, möglicherweise durch Fehler bei der Eingabe. "
+         "Bitte kontrollieren Sie Ihre Eingaben.\n"},
+        {{"plan-text", datei}, 4, "Plan als Text speichern: Plan wird unter " + pfad("PLAN.TXT") + " gespeichert\n"},
+        {{"plan", datei, "01.03.2027", "07.03.2027", "-o", fehlt}, 5, sichern},
+        {{"save", datei, fehlt}, 5, sichern}};
+    const QStringList plan = {"plan", datei, "01.01.2027", "02.01.2027"};
+    for (const QStringList &argumente : QList<QStringList>{
+             {}, {"drucken", datei}, {"info"}, {"info", datei, datei}, {"save", datei}, {"plan", datei, "01.01.2027"},
+             plan + QStringList{"--seed"}, plan + QStringList{"--seed", "sieben"}, plan + QStringList{"--seed", "-1"},
+             plan + QStringList{"--tage", "3"}, {"plan-text", datei, "-o"}, {"addresses-text", datei, "--seed", "1"}})
+        faelle.append({argumente, 64, "Aufruf: pradilon-cli "});   // wrong usage: the usage follows the reason
+    for (const QString &p : {pfad("kaputt.prd"), pfad("fehlt.prd")}) {
+        for (const QStringList &argumente : QList<QStringList>{{"info", p}, {"save", p, neu}, {"plan-text", p},
+                                                                {"plan", p, "01.01.2027", "02.01.2027"},
+                                                                {"addresses-text", p}})
+            faelle.append({argumente, 1, "Fehler beim Öffnen: Dies ist keine Pradilon-Datei! Die Datei konnte "
+                                         "nicht geöffnet werden! \n"});
+    }
+    const QByteArray vorher = Lies(datei);
+    for (const auto &[argumente, code, fehler] : faelle) {
         const Lauf l = cli(argumente);
-        EXPECT_EQ(l.code, 64) << argumente.join(u' ').toStdString();
-        EXPECT_TRUE(l.fehler.contains(QStringLiteral("Aufruf: pradilon-cli "))) << l.fehler.toStdString();
+        EXPECT_EQ(l.code, code) << argumente.join(u' ').toStdString();
+        EXPECT_TRUE(code == 64 ? l.fehler.contains(fehler) : l.fehler == fehler) << l.fehler.toStdString();
         EXPECT_TRUE(l.aus.isEmpty());
     }
-    EXPECT_EQ(LiesDatei(datei), vorher);
-    EXPECT_EQ(dateien(), QStringList{"gemeinde.prd"});
+    EXPECT_EQ(Lies(datei), vorher);
+    EXPECT_EQ(dateien(), (QStringList{"gemeinde.prd", "kaputt.prd"}));
 }
 
-TEST_F(Cli, InfoPrintsFiveLines)
+TEST_F(Cli, PlanWithASeedIsTheCorePlanAndRepeatableInfoAndSave)
 {
-    InitMini d;
-    d.Minis.resize(4);
-    d.AnzahlMinis = 3;
-    d.Ausnahmen.resize(1);
-    d.AnzahlAusnahmen = 1;
-    d.Plan.resize(2);
-    d.AnzahlPlanEintraege = 2;
-    d.Intervall = 7;
-    d.Geschwister = false;
-    const Lauf l = cli({QStringLiteral("info"), schreibe("klein.prd", d)});
-    EXPECT_EQ(l.code, 0);
-    EXPECT_EQ(l.aus, QStringLiteral("Minis: 3\nAusnahmen: 1\nPlaneinträge: 2\nIntervall: 7\nGeschwister: nein\n"));
-    EXPECT_TRUE(l.fehler.isEmpty());
-}
-
-TEST_F(Cli, UnreadableFileExits1ForEveryCommand)
-{
-    ASSERT_TRUE(SchreibeBytes(pfad("kaputt.prd"), "pradilon\r\n 0 \r\n"));
-    for (const char *datei : {"kaputt.prd", "fehlt.prd"}) {
-        const QString p = pfad(datei);
-        for (const QStringList &argumente :
-             QList<QStringList>{{"info", p}, {"save", p, pfad("neu.prd")}, {"plan", p, "01.01.2027", "02.01.2027"},
-                                {"plan-text", p}, {"addresses-text", p}}) {
-            const Lauf l = cli(argumente);
-            EXPECT_EQ(l.code, 1) << argumente.join(u' ').toStdString();
-            EXPECT_EQ(l.fehler, LadeFehler);
-            EXPECT_TRUE(l.aus.isEmpty());
-        }
-    }
-    EXPECT_EQ(dateien(), QStringList{"kaputt.prd"});
-}
-
-TEST_F(Cli, SaveWritesTheSameBytesOrExits5)
-{
-    const QString datei = beispiel();
-    Lauf l = cli({QStringLiteral("save"), datei, pfad("kopie.prd")});
-    EXPECT_EQ(l.code, 0);
-    EXPECT_TRUE(l.fehler.isEmpty());
-    EXPECT_EQ(LiesDatei(pfad("kopie.prd")), LiesDatei(datei));
-
-    l = cli({QStringLiteral("save"), datei, pfad("fehlt/kopie.prd")});
-    EXPECT_EQ(l.code, 5);
-    EXPECT_EQ(l.fehler, QStringLiteral("Fehler beim Sichern: Dateiname oder Pfadangabe ungültig! "
-                                       "Datei konnte nicht gesichert werden.\n"));
-}
-
-TEST_F(Cli, PlanWithSeedIsTheCorePlanAndRepeatable)
-{
-    const QString datei = beispiel();
-    const QByteArray vorher = LiesDatei(datei);
-    const QStringList argumente = {QStringLiteral("plan"), datei, QStringLiteral("03.01.2027"),
-                                   QStringLiteral("28.03.2027"), QStringLiteral("--seed"), QStringLiteral("42"),
-                                   QStringLiteral("-o"), pfad("a.prd")};
-    Lauf l = cli(argumente);
+    const QStringList argumente = {"plan", datei, "03.01.2027", "28.03.2027", "--seed", "42", "-o", pfad("a.prd")};
+    const Lauf l = cli(argumente);
     ASSERT_EQ(l.code, 0) << l.fehler.toStdString();
     EXPECT_TRUE(l.fehler.isEmpty());   // 84 days: no question
-    EXPECT_EQ(LiesDatei(datei), vorher);
+    EXPECT_EQ(cli(QStringList(argumente).replaceInStrings("a.prd", "b.prd")).code, 0);
+    EXPECT_EQ(Lies(pfad("b.prd")), Lies(pfad("a.prd")));
 
-    // The same computation in this process.
-    InitMini d = lade(datei);
+    lade();
     StandardZufall zufall(42);
     TestMeldungen meldungen;
-    TestUhr uhr;
-    PlanGenerator gen(d, zufall);
-    ASSERT_EQ(gen.BtnErstellen_Click(QStringLiteral("03.01.2027"), QStringLiteral("28.03.2027"), meldungen, uhr),
-              PlanGenerator::Ergebnis::Fertig);
-    ASSERT_TRUE(SchreibeDatei(pfad("erwartet.prd"), d));
-    EXPECT_EQ(LiesDatei(pfad("a.prd")), LiesDatei(pfad("erwartet.prd")));
-
-    EXPECT_EQ(cli(QStringList(argumente).replaceInStrings(QStringLiteral("a.prd"), QStringLiteral("b.prd"))).code, 0);
-    EXPECT_EQ(LiesDatei(pfad("b.prd")), LiesDatei(pfad("a.prd")));
-    EXPECT_GT(lade(pfad("a.prd")).AnzahlPlanEintraege, 40);
+    PlanGenerator gen(gemeinde, zufall);
+    ASSERT_EQ(gen.BtnErstellen_Click("03.01.2027", "28.03.2027", meldungen, TestUhr()), PlanGenerator::Ergebnis::Fertig)
+        << "the sample must be plannable";
+    ASSERT_TRUE(SchreibeDatei(pfad("erwartet.prd"), gemeinde));
+    EXPECT_EQ(Lies(pfad("a.prd")), Lies(pfad("erwartet.prd")));
+    EXPECT_EQ(cli({"info", pfad("a.prd")}).aus, QStringLiteral("Minis: 26\nAusnahmen: 12\nPlaneinträge: %1\n"
+                                                                "Intervall: 2\nGeschwister: ja\n")
+                                                     .arg(gemeinde.AnzahlPlanEintraege));
+    EXPECT_EQ(cli({"save", pfad("a.prd"), pfad("kopie.prd")}).code, 0);
+    EXPECT_EQ(Lies(pfad("kopie.prd")), Lies(pfad("a.prd")));
 }
 
-TEST_F(Cli, PlanWithoutOutputReplacesTheFileAndAnswersTheQuestion)
+TEST_F(Cli, TextsNextToTheFileOrAtTheGivenPath)
 {
-    const QString datei = beispiel();
-    const Lauf l = cli({QStringLiteral("plan"), datei, QStringLiteral("01.01.2027"), QStringLiteral("31.12.2027")});
-    EXPECT_EQ(l.code, 0);
-    EXPECT_EQ(l.fehler, QStringLiteral("Planberechnung: Sie wollen einen Plan der Dauer  364 Tage berechnen. "
-                                       "Ist dies korrekt?\n"));
-    const InitMini d = lade(datei);
-    EXPECT_EQ(d.Plan[0].Datum, QStringLiteral("02.01.2027"));
-    EXPECT_EQ(d.Plan[std::size_t(d.AnzahlPlanEintraege - 1)].Datum, QStringLiteral("29.12.2027"));
-    EXPECT_EQ(dateien(), QStringList{"gemeinde.prd"});
-}
-
-TEST_F(Cli, RefusedPeriodExits2CalculationErrorExits3NothingWritten)
-{
-    const QString datei = beispiel();
-    const QByteArray vorher = LiesDatei(datei);
-    auto plan = [&](const char *start, const char *ende) {
-        return cli({QStringLiteral("plan"), datei, QString::fromUtf8(start), QString::fromUtf8(ende),
-                    QStringLiteral("-o"), pfad("neu.prd")});
-    };
-    Lauf l = plan("02.03.2027", "01.03.2027");
-    EXPECT_EQ(l.code, 2);
-    EXPECT_EQ(l.fehler, QStringLiteral("Fehler im Datum: Datum wurde falsch angegeben!\n"));
-
-    l = plan("01.01.2027", "02.01.2028");
-    EXPECT_EQ(l.code, 2);
-    EXPECT_EQ(l.fehler, QStringLiteral("Planberechnung: Sie wollen einen Plan der Dauer  366 Tage berechnen. "
-                                       "Ist dies korrekt?\n"
-                                       "Zeitspanne zu groß: Planberechnung über ein Jahr macht keinen Sinn! \r\r\n"
-                                       "Bitte wählen Sie die Zeitspanne kleiner!\n"));
-
-    l = plan("1. März", "01.03.2027");
-    EXPECT_EQ(l.code, 3);
-    EXPECT_EQ(l.fehler, QStringLiteral("Fehler bei der Planberechnung: Fehler unbekannten Typs, möglicherweise durch "
-                                       "Fehler bei der Eingabe. Bitte kontrollieren Sie Ihre Eingaben.\n"));
-
-    EXPECT_EQ(LiesDatei(datei), vorher);
-    EXPECT_EQ(dateien(), QStringList{"gemeinde.prd"});
-}
-
-TEST_F(Cli, PlanWhoseSaveFailsExits5)
-{
-    const Lauf l = cli({QStringLiteral("plan"), beispiel(), QStringLiteral("01.03.2027"), QStringLiteral("07.03.2027"),
-                        QStringLiteral("-o"), pfad("fehlt/neu.prd")});
+    Lauf l = cli({"plan", datei, "01.01.2027", "31.12.2027"});   // without -o into the file itself
+    ASSERT_EQ(l.code, 0);
+    EXPECT_EQ(l.fehler, "Planberechnung: Sie wollen einen Plan der Dauer  364 Tage berechnen. Ist dies korrekt?\n");
+    lade();
+    TestMeldungen meldungen;
+    ASSERT_EQ(PlanAlsTextSpeichern(gemeinde, meldungen, pfad("plan.txt")), ExportErgebnis::Geschrieben);
+    EXPECT_TRUE(Lies(pfad("plan.txt")).startsWith("Ministrantenplan vom 02.01.2027 bis 29.12.2027\r\n"));
+    EXPECT_EQ(cli({"plan-text", datei}).code, 0);
+    EXPECT_EQ(Lies(pfad("PLAN.TXT")), Lies(pfad("plan.txt")));
+    l = cli({"plan-text", datei, "-o", pfad("fehlt/PLAN.TXT")});
     EXPECT_EQ(l.code, 5);
-    EXPECT_TRUE(l.fehler.startsWith(QStringLiteral("Fehler beim Sichern: ")));
+    EXPECT_TRUE(l.fehler.endsWith("Datei " + pfad("fehlt/PLAN.TXT") + " konnte nicht geschrieben werden.\n"));
+
+    l = cli({"addresses-text", datei});
+    EXPECT_EQ(l.code, 0);
+    EXPECT_EQ(l.fehler, "Adressliste als Text speichern: Adressliste wird unter " + pfad("ADRESS.TXT")
+                            + " gespeichert\n");
+    ASSERT_EQ(AdresslisteAlsTextSpeichern(gemeinde, meldungen, QDate::currentDate(), pfad("adressen.txt")),
+              ExportErgebnis::Geschrieben);
+    EXPECT_EQ(Lies(pfad("ADRESS.TXT")), Lies(pfad("adressen.txt")));
+    ASSERT_TRUE(SchreibeDatei(datei, InitMini()));   // an empty roster still gets its list
+    EXPECT_EQ(cli({"addresses-text", datei, "-o", pfad("leer.txt")}).code, 0);
+    EXPECT_EQ(Lies(pfad("leer.txt")).count("\r\n"), 7);
 }
 
-TEST_F(Cli, PlanTextNextToTheFileOrAtTheGivenPath)
+#ifdef PRADILON_BEISPIEL
+TEST_F(Cli, SampleFileIsWhatItsGeneratorWritesToday)
 {
-    const QString datei = beispiel();
-    Lauf l = cli({QStringLiteral("plan-text"), datei});
-    EXPECT_EQ(l.code, 4);   // the sample holds no plan
-    EXPECT_EQ(l.fehler, QStringLiteral("Plan als Text speichern: Plan wird unter ") + pfad("PLAN.TXT")
-                            + QStringLiteral(" gespeichert\n"));
-    EXPECT_EQ(dateien(), QStringList{"gemeinde.prd"});
-
-    ASSERT_EQ(cli({QStringLiteral("plan"), datei, QStringLiteral("01.03.2027"), QStringLiteral("31.03.2027")}).code, 0);
-    l = cli({QStringLiteral("plan-text"), datei});
-    EXPECT_EQ(l.code, 0);
-    const QByteArray erwartet = Kodiert(PlanZeilen(lade(datei)));
-    EXPECT_EQ(LiesDatei(pfad("PLAN.TXT")), erwartet);
-    EXPECT_TRUE(erwartet.contains("\t\t"));
-
-    l = cli({QStringLiteral("plan-text"), datei, QStringLiteral("-o"), pfad("plan.txt")});
-    EXPECT_EQ(l.code, 0);
-    EXPECT_EQ(LiesDatei(pfad("plan.txt")), erwartet);
-
-    // A relative data file name puts the text into the working folder.
-    l = cli({QStringLiteral("plan-text"), QStringLiteral("gemeinde.prd")});
-    EXPECT_EQ(l.fehler, QStringLiteral("Plan als Text speichern: Plan wird unter PLAN.TXT gespeichert\n"));
-
-    l = cli({QStringLiteral("plan-text"), datei, QStringLiteral("-o"), pfad("fehlt/PLAN.TXT")});
-    EXPECT_EQ(l.code, 5);
-    EXPECT_TRUE(l.fehler.endsWith(QStringLiteral("Plan als Text speichern: Datei ") + pfad("fehlt/PLAN.TXT")
-                                  + QStringLiteral(" konnte nicht geschrieben werden.\n")));
+    const Lauf l = cli({pfad("beispiel.prd")}, QStringLiteral(PRADILON_BEISPIEL));
+    ASSERT_EQ(l.code, 0) << l.fehler.toStdString();
+    EXPECT_EQ(Lies(pfad("beispiel.prd")), Lies(Beispiel))
+        << "examples/beispiel.prd is out of date: run pradilon-beispiel examples/beispiel.prd";
 }
-
-TEST_F(Cli, AddressesTextAlsoForAnEmptyRoster)
-{
-    const QString datei = beispiel();
-    Lauf l = cli({QStringLiteral("addresses-text"), datei});
-    EXPECT_EQ(l.code, 0);
-    EXPECT_EQ(l.fehler, QStringLiteral("Adressliste als Text speichern: Adressliste wird unter ") + pfad("ADRESS.TXT")
-                            + QStringLiteral(" gespeichert\n"));
-    const QDate heute = QDate::currentDate();
-    EXPECT_EQ(LiesDatei(pfad("ADRESS.TXT")), Kodiert(AdressZeilen(lade(datei), heute)));
-
-    const QString leer = schreibe("leer.prd", InitMini());
-    l = cli({QStringLiteral("addresses-text"), leer, QStringLiteral("-o"), pfad("leer.txt")});
-    EXPECT_EQ(l.code, 0);
-    EXPECT_EQ(LiesDatei(pfad("leer.txt")).count("\r\n"), 7);
-}
+#endif
 
 } // namespace
