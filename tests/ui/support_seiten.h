@@ -3,6 +3,7 @@
 #include "support_umgebung.h"
 #include "ui/FormMinis.h"
 
+// Shared by the page tests, with the Qt headers they all use.
 #include <QAbstractButton>
 #include <QCheckBox>
 #include <QComboBox>
@@ -16,9 +17,7 @@ template <class T = QWidget>
 T *kind(const QObject *eltern, const QString &name)
 {
     T *w = eltern->findChild<T *>(name);
-    if (!w)
-        qFatal("missing child %s", qPrintable(name));
-    return w;
+    return w ? w : (qFatal("missing child %s", qPrintable(name)), nullptr);
 }
 
 // Base of the page tests: a fresh main window for each test; the helpers act on the page in seite.

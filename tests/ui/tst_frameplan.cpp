@@ -3,9 +3,7 @@
 #include "support_seiten.h"
 
 #include <QLabel>
-#include <QTest>
 
-// The complete run goes through the end-to-end test.
 class TestFramePlan : public Seitentest
 {
     Q_OBJECT
@@ -27,10 +25,10 @@ private slots:
         static_cast<FramePlan *>(seite)->MnuPlanErstellen_Click();
     }
 
-    void erstellenErstMitBeidenTexten()
+    // The complete run is part of the end-to-end test.
+    void erstellenErstMitBeidenTextenAblehnungLaesstOffen()
     {
         QVERIFY(seite->isVisible() && !erstellbar() && !menueAn());
-        QCOMPARE(f->focusWidget(), kind(seite, "TxtStartDatum"));
         zeitraum("x", QString());
         QVERIFY(!erstellbar());
         zeitraum("x", "y");
@@ -46,10 +44,7 @@ private slots:
         klick("BtnAbbruch3");
         static_cast<FramePlan *>(seite)->MnuPlanErstellen_Click();
         QVERIFY(erstellbar());
-    }
 
-    void abgelehnterOderGescheiterterLaufLaesstPanelOffen()
-    {
         // Start, end, whether the question is answered "Nein", the start of the one message box.
         const char *faelle[][4] = {{"3.12.02", "1.12.02", "", "Fehler im Datum: Datum wurde falsch angegeben!"},
                                    {"1.12.02", "1.12.03", "Nein", "Planberechnung: "},
