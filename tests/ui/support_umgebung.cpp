@@ -1,18 +1,7 @@
 #include "support_umgebung.h"
 
-#include "data/DatenDatei.h"
-#include "ui/FormMinis.h"
-
-#include <QAction>
-#include <QFile>
 #include <QMenu>
-#include <QTest>
-
-Testumgebung::Testumgebung()
-{
-    if (!ordner.isValid())
-        qFatal("no temporary folder");
-}
+#include <QMenuBar>
 
 std::unique_ptr<FormMinis> NeuesHauptfenster(Testumgebung &t)
 {
@@ -27,33 +16,24 @@ std::unique_ptr<FormMinis> NeuesHauptfenster(Testumgebung &t)
 InitMini Beispieldaten(const QStringList &namen, int plaene)
 {
     InitMini d;
-    d.AnzahlMinis = int16_t(namen.size());
-    d.Minis.resize(namen.size() + 1);
-    d.Sperre.assign(namen.size() + 1, 0);
-    d.Einsaetze.assign(namen.size() + 1, 0);
-    for (int i = 0; i < namen.size(); ++i) {
-        d.Minis[i].Name = namen[i];
-        d.Minis[i].Vorname = QStringLiteral("Vorname%1").arg(i);
-    }
+    const int n = int(namen.size());
+    d.AnzahlMinis = int16_t(n);
     d.AnzahlPlanEintraege = int16_t(plaene);
+    d.Minis.resize(n + 1);
+    d.Sperre = d.Einsaetze = std::vector<int16_t>(n + 1, 0);
+    for (int i = 0; i < n; ++i)
+        d.Minis[i].Name = namen[i], d.Minis[i].Vorname = QStringLiteral("Vorname%1").arg(i);
     d.Plan.resize(plaene + 1);
-    for (int i = 0; i < plaene; ++i) {
-        PlanEintrag &e = d.Plan[i];
-        e.Datum = QStringLiteral("%1.01.2027").arg(i + 1, 2, 10, QLatin1Char('0'));
-        e.Wochentag = QStringLiteral("Freitag");
-        e.Zeit = QStringLiteral("9.30");
-        e.MiniAnz = 1;
-        e.Name[0] = namen.value(0);
-        e.Vorname[0] = QStringLiteral("Vorname0");
-    }
+    for (int i = 0; i < plaene; ++i)
+        d.Plan[i] = PlanEintrag{QStringLiteral("%1.01.2027").arg(i + 1, 2, 10, QLatin1Char('0')), "Freitag", "9.30",
+                                1, {namen.value(0)}, {"Vorname0"}};
     return d;
 }
 
 void SchreibeBeispiel(const QString &pfad, const InitMini &daten)
 {
-    QString fehler;
-    if (!SchreibeDatei(pfad, daten, &fehler))
-        qFatal("cannot write %s: %s", qPrintable(pfad), qPrintable(fehler));
+    if (!SchreibeDatei(pfad, daten))
+        qFatal("cannot write %s", qPrintable(pfad));
 }
 
 void Aufraeumen()
@@ -62,52 +42,35 @@ void Aufraeumen()
     QCoreApplication::processEvents();
 }
 
-QAction *Aktion(FormMinis &f, const QString &name)
-{
-    auto *a = f.findChild<QAction *>(name);
-    if (!a)
-        qFatal("no menu item %s", qPrintable(name));
-    return a;
-}
-
-bool MenueAn(FormMinis &f, const QString &menue)
-{
-    auto *m = f.findChild<QMenu *>(menue);
-    if (!m)
-        qFatal("no menu %s", qPrintable(menue));
-    return m->menuAction()->isEnabled();
-}
-
-bool Erreichbar(FormMinis &f, const QString &aktion)
-{
-    QAction *a = Aktion(f, aktion);
-    auto *menu = qobject_cast<QMenu *>(a->parent());
-    return a->isEnabled() && (!menu || menu->menuAction()->isEnabled());
-}
-
 QString SichtbaresBild(FormMinis &f, const QString &knopf)
 {
     QStringList sichtbar;
-    for (const char *zustand : {"Up", "Down", "Dis"}) {
-        auto *bild = f.findChild<QWidget *>(QStringLiteral("Im%1%2").arg(knopf, QLatin1String(zustand)));
-        if (bild && bild->isVisibleTo(&f))
-            sichtbar << QLatin1String(zustand);
-    }
-    return sichtbar.join(QLatin1Char('+'));
+    for (const QString zustand : {"Up", "Down", "Dis"})
+        if (auto *bild = f.findChild<QWidget *>("Im" + knopf + zustand); bild && bild->isVisibleTo(&f))
+            sichtbar << zustand;
+    return sichtbar.join('+');
 }
 
 bool Waehle(FormMinis &f, const QString &aktion)
 {
-    if (!Erreichbar(f, aktion))
-        return false;
-    Aktion(f, aktion)->trigger();
-    return true;
+    auto *a = f.findChild<QAction *>(aktion);
+    if (!a)
+        qFatal("no menu item %s", qPrintable(aktion));
+    const bool erreichbar = a->isEnabled() && qobject_cast<QMenu *>(a->parent())->menuAction()->isEnabled();
+    if (erreichbar)
+        a->trigger();
+    return erreichbar;
 }
 
-QStringList Dateizeilen(const QString &pfad)
+QString Zustand(FormMinis &f)
 {
-    QFile datei(pfad);
-    if (!datei.open(QIODevice::ReadOnly))
-        return {};
-    return QString::fromLatin1(datei.readAll()).split(QStringLiteral("\r\n"));
+    QStringList teile;
+    for (QAction *menue : f.menuBar()->actions())
+        for (QAction *a : menue->menu()->actions())
+            if (!a->isSeparator() && !(a->isEnabled() && menue->isEnabled()))
+                teile << a->objectName().mid(3);
+    teile << "|";
+    for (const char *knopf : {"Open", "Save", "Print", "Search", "New", "Help"})
+        teile << SichtbaresBild(f, knopf);
+    return teile.join(' ');
 }

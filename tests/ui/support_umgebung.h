@@ -1,21 +1,20 @@
 #pragma once
 
-#include "data/InitMini.h"
 #include "support/TestMeldungen.h"
 #include "support/TestUhr.h"
 #include "support/TestZufall.h"
+#include "ui/FormMinis.h"
 #include "ui/Hilfe.h"
-#include "ui/Umgebung.h"
 
 #include <QApplication>
-#include <QStringList>
+#include <QDir>
+#include <QFile>
+#include <QLineEdit>
+#include <QPushButton>
 #include <QTemporaryDir>
-#include <QWidget>
+#include <QTest>
 
 #include <memory>
-
-class FormMinis;
-class QAction;
 
 // Counts the help calls instead of opening a viewer.
 class TestHilfe : public Hilfe
@@ -25,60 +24,54 @@ public:
     QString datei() const override { return m_datei; }
     void ZeigeInhalt() override { ++inhalt; }
     void ZeigeHilfeZurHilfe() override { ++hilfeZurHilfe; }
-
-    int inhalt = 0;
-    int hilfeZurHilfe = 0;
+    int inhalt = 0, hilfeZurHilfe = 0;
 
 private:
     QString m_datei;
 };
 
-// Scripted message boxes, a fixed clock, an exact random source, a counting help viewer and a
-// temporary folder that stands for the program's folder.
+// Scripted seams and a temporary folder standing for the program's folder.
 struct Testumgebung {
-    Testumgebung();
-
     TestMeldungen meldungen;
     TestUhr uhr;
     TestZufall zufall;
     TestHilfe hilfe;
     QTemporaryDir ordner;
-
     Umgebung umgebung() { return Umgebung{meldungen, uhr, zufall, hilfe, ordner.path()}; }
     QString pfad(const QString &name) const { return ordner.filePath(name); }
 };
 
 // A fresh, shown and active main window.
 std::unique_ptr<FormMinis> NeuesHauptfenster(Testumgebung &t);
-
-// A data set with the given servers (family names) and, if plaene > 0, that many plan entries.
+// Servers with these family names and, if plaene > 0, that many plan entries.
 InitMini Beispieldaten(const QStringList &namen, int plaene = 0);
-
-// Writes daten as a data file; fails the test if it cannot.
 void SchreibeBeispiel(const QString &pfad, const InitMini &daten);
 
-// Top-level widgets of the program: the visible secondary window of that type, or null.
+// The visible top-level window of that type, or null.
 template <typename T>
 T *OffenesFenster()
 {
-    for (QWidget *w : QApplication::topLevelWidgets()) {
+    for (QWidget *w : QApplication::topLevelWidgets())
         if (auto *t = qobject_cast<T *>(w); t && t->isVisible())
             return t;
-    }
     return nullptr;
 }
 
 // Deletes what was closed with deleteLater (secondary windows are deleted on close).
 void Aufraeumen();
 
-QAction *Aktion(FormMinis &f, const QString &name);
-// Enabled as the user sees it: the item and its top-level menu.
-bool Erreichbar(FormMinis &f, const QString &aktion);
-bool MenueAn(FormMinis &f, const QString &menue);
-// Which of the Up / Down / Dis images of a toolbar button is visible ("Up", "Down", "Dis"), or
-// a list of them when it is not exactly one.
+// The visible image of a toolbar button ("Up", "Down", "Dis"), joined with "+" when not exactly one.
 QString SichtbaresBild(FormMinis &f, const QString &knopf);
-// Triggers a menu item only when the user could reach it.
+// Triggers a menu item only when the user could reach it (the item and its menu enabled).
 bool Waehle(FormMinis &f, const QString &aktion);
-
-QStringList Dateizeilen(const QString &pfad);
+// The menu items the user cannot reach (without "Mnu") and the toolbar images: "Speichern ... | Up Dis ...".
+QString Zustand(FormMinis &f);
+// Zustand at start, while a page is edited, with servers, with servers and a plan.
+inline const QString ZustandStart = QStringLiteral(
+    "Speichern SpeichernUnter AdressenSpeichern PlanSpeichern Drucken PdfSpeichern PlanAnzeigen PlanErstellen | "
+    "Up Dis Dis Up Dis Up");
+inline const QString ZustandBearbeitung = QStringLiteral(
+    "Laden Speichern SpeichernUnter AdressenSpeichern PlanSpeichern Drucken PdfSpeichern ProgrammBeenden Liste "
+    "Termine PlanAnzeigen PlanErstellen Einstellungen | Dis Dis Dis Dis Dis Up");
+inline const QString ZustandMitMinis = QStringLiteral("PlanAnzeigen | Up Up Up Up Dis Up");
+inline const QString ZustandMitPlan = QStringLiteral("| Up Up Up Up Up Up");

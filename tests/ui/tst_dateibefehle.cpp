@@ -1,399 +1,177 @@
-// The file commands of the main window: open, save, save under a new name and quit, with their
-// questions, flags, toolbar images and titles, through the real file browser.
+// The file commands through the real file browser, and the browser's own cases.
 #include "support_umgebung.h"
 
 #include "ui/FormFileBrw.h"
-#include "ui/FormMinis.h"
 
-#include <QDir>
-#include <QFile>
-#include <QLineEdit>
-#include <QPushButton>
+#include <QComboBox>
+#include <QListView>
 #include <QSignalSpy>
-#include <QTest>
 
 namespace {
 
-// Types a name into the open browser and clicks OK.
-void BrowserOK(const QString &name)
+// Types a name into the browser and clicks OK; no name: Escape.
+void BrowserOK(const QString &name, QWidget *browser = OffenesFenster<FormFileBrw>())
 {
-    auto *browser = OffenesFenster<FormFileBrw>();
-    QVERIFY(browser);
     browser->findChild<QLineEdit *>("TxtDatei")->setText(name);
-    QTest::mouseClick(browser->findChild<QPushButton *>("CmdOK"), Qt::LeftButton);
+    name.isEmpty() ? QTest::keyClick(browser, Qt::Key_Escape) : browser->findChild<QPushButton *>("CmdOK")->click();
 }
 
-const QString Frage = QStringLiteral("Sollen Änderungen in %1 gesichert werden?");
+QString Frage(const QString &pfad) { return "Sollen Änderungen in " + pfad.toUpper() + " gesichert werden?"; }
 
 } // namespace
 
 class TestDateibefehle : public QObject
 {
     Q_OBJECT
-
 private slots:
     void cleanup() { Aufraeumen(); }
-
-    void oeffnenOhneAenderungen();
-    void oeffnenMitAenderungenJa();
-    void oeffnenMitAenderungenNein();
-    void oeffnenMitAenderungenJaUndFehlschlagLaedtNicht();
-    void oeffnenFehlendeDatei();
-    void oeffnenMitMuster();
-    void oeffnenKeineDatendatei();
-    void oeffnenAbbruchAendertNichts();
-    void speichernOhneAenderungSchreibtNichts();
-    void speichernMitAenderung();
-    void speichernUnterSchreibtImmerUndSetztTitel();
-    void beendenOhneAenderungen();
-    void beendenMitAenderungen_data();
-    void beendenMitAenderungen();
-    void beendenJaMitFehlschlagBleibtOffen();
-    void schliessfeldWieProgrammBeenden();
-    void schliessfeldWaehrendSekundaerfensterWirkungslos();
+    void oeffnen();
+    void speichernUndSpeichernUnter();
+    void beenden();
+    void browserLaufwerkMusterUndNamen();
 };
 
-void TestDateibefehle::oeffnenOhneAenderungen()
+// The browser stays open after a failed save (the data stays too) and after a name it cannot use.
+void TestDateibefehle::oeffnen()
 {
-    Testumgebung t;
-    SchreibeBeispiel(t.pfad("pfarrei.prd"), Beispieldaten({"Abel", "Berg"}));
-    auto f = NeuesHauptfenster(t);
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    QVERIFY(f->Daten().DateiLaden);
-    QVERIFY(!f->isEnabled());
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Down"));
-    QCOMPARE(OffenesFenster<FormFileBrw>()->windowTitle(), QString("Datei öffnen"));
+    const QString frage = "Datei öffnen", ungueltig = "Ungültiger Dateiname", fremd = "Fehler beim Öffnen";
+    // changed, answer, current file, name typed ("": Escape), titles of the messages, first server afterwards
+    const QList<std::tuple<bool, Antwort, QString, QString, QString, QString>> faelle = {
+        {false, Antwort::Ja, "alt.prd", "neu.prd", "", "Neu"},
+        {true, Antwort::Ja, "alt.prd", "neu.prd", frage, "Neu"},
+        {true, Antwort::Nein, "alt.prd", "neu.prd", frage, "Neu"},
+        {true, Antwort::Ja, "fehlt/alt.prd", "neu.prd", frage + "|Fehler beim Sichern", "Alt"},
+        {false, Antwort::Ja, "alt.prd", "N*.PRD", "", "Neu"},
+        {false, Antwort::Ja, "alt.prd", "*.txt", ungueltig, "Alt"},
+        {false, Antwort::Ja, "alt.prd", "./neu.prd", ungueltig, "Alt"},
+        {true, Antwort::Nein, "alt.prd", "gibtsnicht.prd", frage + "|" + ungueltig, "Alt"},
+        {true, Antwort::Nein, "alt.prd", "fremd.prd", frage + "|" + fremd, "Alt"},
+        {true, Antwort::Ja, "alt.prd", "", "", "Alt"}};
+    for (const auto &[geaendert, antwort, alt, name, titel, danach] : faelle) {
+        Testumgebung t;
+        SchreibeBeispiel(t.pfad("neu.prd"), Beispieldaten({"Neu"}));
+        QFile keineDaten(t.pfad("fremd.prd"));
+        QVERIFY(keineDaten.open(QIODevice::WriteOnly) && keineDaten.write("pradilon\r\n 0 \r\n") && keineDaten.flush());
+        auto f = NeuesHauptfenster(t);
+        f->Daten() = Beispieldaten({"Alt"});
+        f->Daten().Dateiname = t.pfad(alt);
+        f->Daten().Geaendert = geaendert;
+        QVERIFY(Waehle(*f, "MnuLaden") && f->Daten().DateiLaden && !f->isEnabled());
+        QVERIFY(SichtbaresBild(*f, "Open") == "Down" && OffenesFenster<FormFileBrw>()->windowTitle() == frage);
+        t.meldungen.antworte(antwort);
+        BrowserOK(name);
 
-    BrowserOK("pfarrei.prd");
-    QVERIFY(t.meldungen.gezeigt().empty());
-    QVERIFY(!OffenesFenster<FormFileBrw>());
-    QVERIFY(f->isEnabled());
-    QCOMPARE(f->Daten().AnzahlMinis, int16_t(2));
-    QCOMPARE(f->Daten().Minis[1].Name, QString("Berg"));
-    QCOMPARE(f->Daten().Dateiname, QDir::toNativeSeparators(t.pfad("pfarrei.prd")));
-    QCOMPARE(f->windowTitle(), "Ministrantenplan - " + f->Daten().Dateiname.toUpper());
-    QVERIFY(!f->Daten().DateiLaden);
-    QVERIFY(!f->Daten().Geaendert);
-    // Loaded servers enable the save group; without a plan the view stays off.
-    QVERIFY(Erreichbar(*f, "MnuSpeichern"));
-    QVERIFY(MenueAn(*f, "MnuAusführen"));
-    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Dis"));
+        const QMap<QString, QString> texte = {
+            {frage, Frage(t.pfad(alt))},
+            {ungueltig, "Datei befindet sich nicht in diesem Verzeichnis oder der Dateiname ist ungültig!"},
+            {fremd, "Dies ist keine Pradilon-Datei! Die Datei konnte nicht geöffnet werden! "}};
+        QCOMPARE(t.meldungen.titel().join('|'), titel);
+        for (int i = 0; i < t.meldungen.titel().size(); ++i)
+            QCOMPARE(t.meldungen.texte()[i], texte.value(t.meldungen.titel()[i], t.meldungen.texte()[i]));
+        QCOMPARE(QFile::exists(t.pfad(alt)), titel == frage && antwort == Antwort::Ja);
+        if (auto *browser = OffenesFenster<FormFileBrw>())
+            QVERIFY(browser->close() && (titel.contains("Fehler beim Sichern") || titel.contains(ungueltig)));
+        const bool geladen = danach == "Neu";
+        QVERIFY(f->Daten().Minis[0].Name == danach && f->Daten().Geaendert == (geaendert && !geladen));
+        QCOMPARE(f->Daten().Dateiname, geladen ? QDir::toNativeSeparators(t.pfad("neu.prd")) : t.pfad(alt));
+        QCOMPARE(f->windowTitle(), "Ministrantenplan - " + f->Daten().Dateiname.toUpper());
+        QVERIFY(!f->Daten().DateiLaden && f->isEnabled());
+        QCOMPARE(Zustand(*f), geladen ? ZustandMitMinis : ZustandStart);
+    }
 }
 
-void TestDateibefehle::oeffnenMitAenderungenJa()
-{
-    Testumgebung t;
-    SchreibeBeispiel(t.pfad("neu.prd"), Beispieldaten({"Neu"}));
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Alt"});
-    f->Daten().Dateiname = t.pfad("alt.prd");
-    f->Daten().Geaendert = true;
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    t.meldungen.antworte(Antwort::Ja);
-    BrowserOK("neu.prd");
-
-    QCOMPARE(t.meldungen.texte(), QStringList{Frage.arg(t.pfad("alt.prd").toUpper())});
-    QCOMPARE(t.meldungen.titel(), QStringList{"Datei öffnen"});
-    QCOMPARE(t.meldungen.gezeigt().front().knoepfe, Knoepfe::JaNein);
-    QVERIFY(Dateizeilen(t.pfad("alt.prd")).contains("Alt"));
-    QCOMPARE(f->Daten().Minis[0].Name, QString("Neu"));
-    QVERIFY(!f->Daten().Geaendert);
-}
-
-void TestDateibefehle::oeffnenMitAenderungenNein()
-{
-    Testumgebung t;
-    SchreibeBeispiel(t.pfad("neu.prd"), Beispieldaten({"Neu"}));
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Alt"});
-    f->Daten().Dateiname = t.pfad("alt.prd");
-    f->Daten().Geaendert = true;
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    t.meldungen.antworte(Antwort::Nein);
-    BrowserOK("neu.prd");
-
-    QCOMPARE(t.meldungen.gezeigt().size(), size_t(1));
-    QVERIFY(!QFile::exists(t.pfad("alt.prd")));
-    QCOMPARE(f->Daten().Minis[0].Name, QString("Neu"));
-    QVERIFY(!f->Daten().Geaendert);
-    // The discarded changes are not asked for again.
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    BrowserOK("neu.prd");
-    QCOMPARE(t.meldungen.gezeigt().size(), size_t(1));
-}
-
-void TestDateibefehle::oeffnenMitAenderungenJaUndFehlschlagLaedtNicht()
-{
-    Testumgebung t;
-    SchreibeBeispiel(t.pfad("neu.prd"), Beispieldaten({"Neu"}));
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Alt"});
-    f->Daten().Dateiname = t.pfad("fehlt/alt.prd");
-    f->Daten().Geaendert = true;
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    t.meldungen.antworte(Antwort::Ja);
-    BrowserOK("neu.prd");
-
-    // The save failed: the unsaved data must not be replaced.
-    QCOMPARE(t.meldungen.titel(), (QStringList{"Datei öffnen", "Fehler beim Sichern"}));
-    QCOMPARE(f->Daten().Minis[0].Name, QString("Alt"));
-    QVERIFY(f->Daten().Geaendert);
-    QCOMPARE(f->Daten().Dateiname, t.pfad("fehlt/alt.prd"));
-    QVERIFY(OffenesFenster<FormFileBrw>());
-    OffenesFenster<FormFileBrw>()->close();
-}
-
-void TestDateibefehle::oeffnenFehlendeDatei()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Alt"});
-    f->Daten().Geaendert = true;
-    const QString vorher = f->Daten().Dateiname;
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    t.meldungen.antworte(Antwort::Nein);
-    BrowserOK("gibtsnicht.prd");
-
-    QCOMPARE(t.meldungen.titel(), (QStringList{"Datei öffnen", "Ungültiger Dateiname"}));
-    QCOMPARE(t.meldungen.texte().last(),
-             QString("Datei befindet sich nicht in diesem Verzeichnis oder der Dateiname ist ungültig!"));
-    QCOMPARE(t.meldungen.gezeigt().back().symbol, Symbol::Kritisch);
-    // The dialog stays open; nothing was loaded, so the changes are still unsaved.
-    QVERIFY(OffenesFenster<FormFileBrw>());
-    QVERIFY(!f->isEnabled());
-    QVERIFY(f->Daten().Geaendert);
-    QCOMPARE(f->Daten().Dateiname, vorher);
-    QCOMPARE(f->Daten().Minis[0].Name, QString("Alt"));
-    QTest::mouseClick(OffenesFenster<FormFileBrw>()->findChild<QPushButton *>("CmdAbbruch"), Qt::LeftButton);
-    QVERIFY(f->isEnabled());
-}
-
-void TestDateibefehle::oeffnenMitMuster()
-{
-    Testumgebung t;
-    SchreibeBeispiel(t.pfad("b.prd"), Beispieldaten({"Bert"}));
-    SchreibeBeispiel(t.pfad("a.prd"), Beispieldaten({"Anna"}));
-    QFile andere(t.pfad("0.txt"));
-    QVERIFY(andere.open(QIODevice::WriteOnly));
-    andere.close();
-    auto f = NeuesHauptfenster(t);
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    // The name box holds the pattern "*.prd" from the start.
-    BrowserOK(OffenesFenster<FormFileBrw>()->findChild<QLineEdit *>("TxtDatei")->text());
-    QVERIFY(t.meldungen.gezeigt().empty());
-    QCOMPARE(f->Daten().Minis[0].Name, QString("Anna"));
-    QCOMPARE(f->Daten().Dateiname, QDir::toNativeSeparators(t.pfad("a.prd")));
-
-    // Without a data file in the folder the pattern finds nothing.
-    QVERIFY(QFile::remove(t.pfad("a.prd")) && QFile::remove(t.pfad("b.prd")));
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    BrowserOK("*.prd");
-    QCOMPARE(t.meldungen.titel(), QStringList{"Ungültiger Dateiname"});
-    OffenesFenster<FormFileBrw>()->close();
-}
-
-void TestDateibefehle::oeffnenKeineDatendatei()
-{
-    Testumgebung t;
-    QFile fremd(t.pfad("fremd.prd"));
-    QVERIFY(fremd.open(QIODevice::WriteOnly));
-    fremd.write("pradilon\r\n 0 \r\n");
-    fremd.close();
-    auto f = NeuesHauptfenster(t);
-    f->Daten().Dateiname = t.pfad("vorher.prd");
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    BrowserOK("fremd.prd");
-
-    QCOMPARE(t.meldungen.titel(), QStringList{"Fehler beim Öffnen"});
-    QCOMPARE(t.meldungen.texte(),
-             QStringList{"Dies ist keine Pradilon-Datei! Die Datei konnte nicht geöffnet werden! "});
-    // The dialog closes as after a success; name and title are the old ones.
-    QVERIFY(!OffenesFenster<FormFileBrw>());
-    QCOMPARE(f->Daten().Dateiname, t.pfad("vorher.prd"));
-    QCOMPARE(f->windowTitle(), "Ministrantenplan - " + t.pfad("vorher.prd").toUpper());
-    QVERIFY(!Erreichbar(*f, "MnuSpeichern"));
-}
-
-void TestDateibefehle::oeffnenAbbruchAendertNichts()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Alt"});
-    f->Daten().Geaendert = true;
-    const QString vorher = f->Daten().Dateiname;
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    QTest::keyClick(OffenesFenster<FormFileBrw>(), Qt::Key_Escape);
-    QVERIFY(!OffenesFenster<FormFileBrw>());
-    QVERIFY(t.meldungen.gezeigt().empty());
-    QCOMPARE(f->Daten().Dateiname, vorher);
-    QVERIFY(f->Daten().Geaendert);
-    QCOMPARE(f->Daten().Minis[0].Name, QString("Alt"));
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Up"));
-}
-
-void TestDateibefehle::speichernOhneAenderungSchreibtNichts()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Abel"});
-    f->Daten().Dateiname = t.pfad("nie.prd");
-    f->MenueAktivieren();
-    QVERIFY(Waehle(*f, "MnuSpeichern"));
-    QTest::mouseClick(f->findChild<QWidget *>("ImSaveUp"), Qt::LeftButton);
-    QVERIFY(!QFile::exists(t.pfad("nie.prd")));
-    QVERIFY(t.meldungen.gezeigt().empty());
-}
-
-void TestDateibefehle::speichernMitAenderung()
+// Speichern writes only changes; Speichern unter writes also without and titles the window anew.
+void TestDateibefehle::speichernUndSpeichernUnter()
 {
     Testumgebung t;
     auto f = NeuesHauptfenster(t);
     f->Daten() = Beispieldaten({"Abel"});
     f->Daten().Dateiname = t.pfad("jetzt.prd");
-    f->Daten().Geaendert = true;
     f->MenueAktivieren();
+    QVERIFY(Waehle(*f, "MnuSpeichern") && !QFile::exists(t.pfad("jetzt.prd")));
+    f->Daten().Geaendert = true;
     QTest::mouseClick(f->findChild<QWidget *>("ImSaveUp"), Qt::LeftButton);
-    QCOMPARE(Dateizeilen(t.pfad("jetzt.prd")).value(0), QString("pRaDiLoN"));
-    QVERIFY(!f->Daten().Geaendert);
-    QVERIFY(t.meldungen.gezeigt().empty());
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Up"));
-}
+    InitMini gelesen;
+    QVERIFY(LeseDatei(t.pfad("jetzt.prd"), gelesen) && gelesen.Minis[0].Name == "Abel" && !f->Daten().Geaendert);
 
-void TestDateibefehle::speichernUnterSchreibtImmerUndSetztTitel()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    f->Daten() = Beispieldaten({"Abel"});
-    f->MenueAktivieren();
-    QVERIFY(!f->Daten().Geaendert);
-    QVERIFY(Waehle(*f, "MnuSpeichernUnter"));
-    QVERIFY(f->Daten().DateiSpeichernUnter);
+    QVERIFY(Waehle(*f, "MnuSpeichernUnter") && f->Daten().DateiSpeichernUnter && SichtbaresBild(*f, "Save") == "Down");
     QCOMPARE(OffenesFenster<FormFileBrw>()->windowTitle(), QString("Datei speichern unter"));
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Down"));
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Up"));
     BrowserOK("kopie.prd");
-
-    QVERIFY(t.meldungen.gezeigt().empty());
-    QVERIFY(Dateizeilen(t.pfad("kopie.prd")).contains("Abel"));
-    QVERIFY(!f->Daten().Geaendert);
-    QVERIFY(!f->Daten().DateiSpeichernUnter);
+    QVERIFY(LeseDatei(t.pfad("kopie.prd"), gelesen) && !f->Daten().Geaendert && !f->Daten().DateiSpeichernUnter);
     QCOMPARE(f->windowTitle(), "Ministrantenplan - " + QDir::toNativeSeparators(t.pfad("kopie.prd")).toUpper());
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Up"));
-    QVERIFY(f->isEnabled());
-
-    // A pattern is no name to save under.
-    QVERIFY(Waehle(*f, "MnuSpeichernUnter"));
-    BrowserOK("*.prd");
-    QCOMPARE(t.meldungen.titel(), QStringList{"Ungültiger Dateiname"});
-    QVERIFY(!QFile::exists(t.pfad("*.prd")));
-    OffenesFenster<FormFileBrw>()->close();
+    QVERIFY(t.meldungen.gezeigt().empty() && Zustand(*f) == ZustandMitMinis);
 }
 
-void TestDateibefehle::beendenOhneAenderungen()
+// "Programm beenden" and the close box ask the same; a failed save on Ja keeps the program.
+void TestDateibefehle::beenden()
+{
+    const QList<std::tuple<bool, Antwort, QString, bool>> faelle = {   // changed, answer, file, ends
+        {false, Antwort::Ja, "ende.prd", true},  {false, Antwort::Nein, "ende.prd", false},
+        {true, Antwort::Ja, "ende.prd", true},   {true, Antwort::Nein, "ende.prd", true},
+        {true, Antwort::Abbrechen, "ende.prd", false}, {true, Antwort::Ja, "fehlt/ende.prd", false}};
+    for (bool schliessfeld : {false, true}) {
+        for (const auto &[geaendert, antwort, datei, beendet] : faelle) {
+            Testumgebung t;
+            auto f = NeuesHauptfenster(t);
+            QSignalSpy ende(f.get(), &FormMinis::ProgrammEnde);
+            f->Daten() = Beispieldaten({"Abel"});
+            f->Daten().Dateiname = t.pfad(datei);
+            f->Daten().Geaendert = geaendert;
+            t.meldungen.antworte(antwort);
+            QVERIFY(schliessfeld ? f->close() == beendet : Waehle(*f, "MnuProgrammBeenden"));
+            const auto &m = t.meldungen.gezeigt();
+            QCOMPARE(m.size(), size_t(datei.startsWith("fehlt") ? 2 : 1));
+            QCOMPARE(m.front().text, geaendert ? Frage(t.pfad(datei)) : QString("Soll das Programm beendet werden?"));
+            QVERIFY(m.front().titel == "Programm beenden");
+            QVERIFY(m.front().knoepfe == (geaendert ? Knoepfe::JaNeinAbbrechen : Knoepfe::JaNein));
+            QVERIFY(ende.count() == int(beendet) && f->isVisible() != beendet);
+            QCOMPARE(QFile::exists(t.pfad(datei)), geaendert && antwort == Antwort::Ja && beendet);
+            QCOMPARE(f->Daten().Geaendert, geaendert && !(antwort == Antwort::Ja && beendet));
+        }
+    }
+}
+
+// With stand-ins for loading and saving: "*.*" lists every file (also one without an extension),
+// a drive that does not answer, names that cannot be saved under, and a root folder.
+void TestDateibefehle::browserLaufwerkMusterUndNamen()
 {
     Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QSignalSpy ende(f.get(), &FormMinis::ProgrammEnde);
-    t.meldungen.antworte(Antwort::Nein);
-    QVERIFY(Waehle(*f, "MnuProgrammBeenden"));
-    QCOMPARE(t.meldungen.texte(), QStringList{"Soll das Programm beendet werden?"});
-    QCOMPARE(t.meldungen.titel(), QStringList{"Programm beenden"});
-    QCOMPARE(t.meldungen.gezeigt().front().knoepfe, Knoepfe::JaNein);
-    QCOMPARE(ende.count(), 0);
-    QVERIFY(f->isVisible());
+    for (const char *name : {"a.prd", "B.PRD", "c.txt", "d"})
+        QVERIFY(QFile(t.pfad(name)).open(QIODevice::WriteOnly));
+    InitMini d;
+    d.DateiSpeichernUnter = true;
+    QStringList gespeichert;
+    const auto speichern = [&](bool) { return gespeichert << d.Dateiname, SpeicherErgebnis::Gespeichert; };
+    const QString fehlt = t.pfad("laufwerk-x");
+    FormFileBrw b(d, t.meldungen, {[] { return true; }, speichern}, t.ordner.path(), {"/", fehlt + "/"});
+    b.show();
+    auto *liste = b.findChild<QListView *>("FileList");
+    const auto dateien = [liste] {
+        QStringList namen;
+        for (int i = 0; i < liste->model()->rowCount(liste->rootIndex()); ++i)
+            namen << liste->model()->index(i, 0, liste->rootIndex()).data().toString();
+        return namen.sort(), namen;
+    };
+    QTRY_COMPARE(dateien(), (QStringList{"B.PRD", "a.prd"}));
+    b.findChild<QComboBox *>("CmbDateiFormat")->setCurrentIndex(1);
+    QCOMPARE(b.findChild<QLineEdit *>("TxtDatei")->text(), QString("*.*"));
+    QTRY_COMPARE(dateien(), (QStringList{"B.PRD", "a.prd", "c.txt", "d"}));
 
-    t.meldungen.antworte(Antwort::Ja);
-    QVERIFY(Waehle(*f, "MnuProgrammBeenden"));
-    QCOMPARE(ende.count(), 1);
-    QVERIFY(!f->isVisible());
-}
+    auto *laufwerke = b.findChild<QComboBox *>("DriveList");
+    laufwerke->setCurrentIndex(1);
+    const QString name = QDir::toNativeSeparators(fehlt).toUpper();
+    QCOMPARE(t.meldungen.titel(), QStringList{"Fehler bei Laufwerk " + name});
+    QCOMPARE(t.meldungen.texte(), QStringList{"Laufwerk " + name + " antwortet nicht! Prüfen Sie, ob ein "
+                                              "Datenträger eingelegt ist, oder ob das Laufwerk existiert."});
+    QVERIFY(laufwerke->currentIndex() == 0 && b.pfad() == QDir::cleanPath(t.ordner.path()));
 
-void TestDateibefehle::beendenMitAenderungen_data()
-{
-    QTest::addColumn<Antwort>("antwort");
-    QTest::addColumn<bool>("beendet");
-    QTest::addColumn<bool>("geschrieben");
-    QTest::newRow("Ja") << Antwort::Ja << true << true;
-    QTest::newRow("Nein") << Antwort::Nein << true << false;
-    QTest::newRow("Abbrechen") << Antwort::Abbrechen << false << false;
-}
-
-void TestDateibefehle::beendenMitAenderungen()
-{
-    QFETCH(Antwort, antwort);
-    QFETCH(bool, beendet);
-    QFETCH(bool, geschrieben);
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QSignalSpy ende(f.get(), &FormMinis::ProgrammEnde);
-    f->Daten() = Beispieldaten({"Abel"});
-    f->Daten().Dateiname = t.pfad("ende.prd");
-    f->Daten().Geaendert = true;
-    t.meldungen.antworte(antwort);
-    QVERIFY(Waehle(*f, "MnuProgrammBeenden"));
-
-    QCOMPARE(t.meldungen.texte(), QStringList{Frage.arg(t.pfad("ende.prd").toUpper())});
-    QCOMPARE(t.meldungen.gezeigt().front().knoepfe, Knoepfe::JaNeinAbbrechen);
-    QCOMPARE(ende.count(), beendet ? 1 : 0);
-    QCOMPARE(f->isVisible(), !beendet);
-    QCOMPARE(QFile::exists(t.pfad("ende.prd")), geschrieben);
-    if (antwort == Antwort::Abbrechen)
-        QVERIFY(f->Daten().Geaendert);
-}
-
-void TestDateibefehle::beendenJaMitFehlschlagBleibtOffen()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QSignalSpy ende(f.get(), &FormMinis::ProgrammEnde);
-    f->Daten() = Beispieldaten({"Abel"});
-    f->Daten().Dateiname = t.pfad("fehlt/ende.prd");
-    f->Daten().Geaendert = true;
-    t.meldungen.antworte(Antwort::Ja);
-    QVERIFY(Waehle(*f, "MnuProgrammBeenden"));
-    QCOMPARE(t.meldungen.titel(), (QStringList{"Programm beenden", "Fehler beim Sichern"}));
-    QCOMPARE(ende.count(), 0);
-    QVERIFY(f->isVisible());
-    QVERIFY(f->Daten().Geaendert);
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Dis"));
-}
-
-void TestDateibefehle::schliessfeldWieProgrammBeenden()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QSignalSpy ende(f.get(), &FormMinis::ProgrammEnde);
-    t.meldungen.antworte(Antwort::Nein);
-    QVERIFY(!f->close());
-    QCOMPARE(t.meldungen.texte(), QStringList{"Soll das Programm beendet werden?"});
-    QVERIFY(f->isVisible());
-
-    f->Daten() = Beispieldaten({"Abel"});
-    f->Daten().Dateiname = t.pfad("box.prd");
-    f->Daten().Geaendert = true;
-    t.meldungen.antworte(Antwort::Abbrechen);
-    QVERIFY(!f->close());
-    QVERIFY(f->isVisible());
-    QVERIFY(!QFile::exists(t.pfad("box.prd")));
-
-    t.meldungen.antworte(Antwort::Ja);
-    QVERIFY(f->close());
-    QVERIFY(QFile::exists(t.pfad("box.prd")));
-    QCOMPARE(ende.count(), 1);
-    QCOMPARE(t.meldungen.titel(), QStringList(3, "Programm beenden"));
-}
-
-void TestDateibefehle::schliessfeldWaehrendSekundaerfensterWirkungslos()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QVERIFY(Waehle(*f, "MnuEinstellungen"));
-    QVERIFY(!f->close());
-    QVERIFY(t.meldungen.gezeigt().empty());
-    QVERIFY(f->isVisible());
+    // In the root folder the name gets no second separator.
+    t.meldungen.leeren();
+    b.oeffneOrdner("/");
+    for (const char *name : {"*.prd", "  ", "..", "a/b.prd", "a\\b", "a?b", "a|b", "a\"b", "a<b", "a\tb", "wurzel.prd"})
+        BrowserOK(name, &b);
+    QCOMPARE(t.meldungen.titel(), QStringList(10, "Ungültiger Dateiname"));
+    QCOMPARE(gespeichert, QStringList{QDir::toNativeSeparators("/wurzel.prd")});
 }
 
 QTEST_MAIN(TestDateibefehle)

@@ -1,497 +1,272 @@
-// The main window: start state, menu tree, toolbar, clock, idle and editing state, shortcuts,
-// help entry points and the secondary windows it opens.
+// The main window and what it opens directly: menus, toolbar, clock, editing state, shortcuts,
+// secondary windows, the settings dialog, the info window, help and the message boxes.
 #include "support_umgebung.h"
 
 #include "ui/FormEinstellungen.h"
 #include "ui/FormFileBrw.h"
 #include "ui/FormInfo.h"
-#include "ui/FormMinis.h"
-#include "ui/FormPlan.h"
-#include "ui/Werkzeugknopf.h"
+#include "ui/QtMeldungen.h"
 
-#include <QAction>
-#include <QFile>
+#include <QCheckBox>
 #include <QLabel>
-#include <QMenu>
 #include <QMenuBar>
-#include <QPushButton>
-#include <QTest>
+#include <QMessageBox>
+#include <QPointer>
 #include <QTimer>
+
+namespace {
+
+FormEinstellungen *Oeffne(FormMinis &f)
+{
+    f.Einstellungen();
+    QApplication::setActiveWindow(OffenesFenster<FormEinstellungen>());
+    return OffenesFenster<FormEinstellungen>();
+}
+
+QLineEdit *Text(QWidget *e) { return e->findChild<QLineEdit *>("TxtIntervall"); }
+void Klicke(QWidget *e, const char *name) { QTest::mouseClick(e->findChild<QAbstractButton *>(name), Qt::LeftButton); }
+void Tippe(QWidget *e, const QString &eingabe) { Text(e)->setFocus(Qt::TabFocusReason), Text(e)->setText(eingabe); }
+
+} // namespace
 
 class TestFormMinis : public QObject
 {
     Q_OBJECT
-
 private slots:
     void cleanup() { Aufraeumen(); }
-
-    void menuebaumMitBeschriftungenUndStartzustand();
-    void werkzeugleisteImStartzustand();
-    void bilderSind24x22UndUnterscheidenSich();
-    void nurDasUpBildReagiert();
-    void titelUndUhr();
+    void startzustand();
     void bearbeitungszustandUndZurueck();
-    void menueAktivierenSchaltetNurEin();
-    void menueAktivierenMitMinisUndPlan();
-    void tastenkuerzelNurBeiErreichbaremEintrag();
-    void hilfeEinstiegspunkte();
-    void infoSperrtHauptfensterBisOK();
-    void sekundaerfensterBleibtBedienbarUndJedesSchliessenStelltHer();
-    void planAnzeigeDruecktNeuKnopf();
-    void textexporteSchreibenNebenDieDatei();
+    void tastenUndHilfe();
+    void sekundaerfensterSperrenBisZumSchliessen();
+    void infoUndHilfefenster();
+    void meldungenMitDeutschenKnoepfen();
+    void einstellungen();
 };
 
-void TestFormMinis::menuebaumMitBeschriftungenUndStartzustand()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-
-    const QList<QPair<QString, QString>> menues = {
-        {"MnuDatei", "&Datei"}, {"MnuBearbeiten", "&Bearbeiten"}, {"MnuAnsicht", "An&sicht"},
-        {"MnuAusführen", "&Ausführen"}, {"MnuOptionen", "&Optionen"}, {"MnuHilfe", "&Hilfe"}};
-    const QList<QAction *> oben = f->menuBar()->actions();
-    QCOMPARE(oben.size(), menues.size());
-    for (int i = 0; i < menues.size(); ++i) {
-        auto *m = f->findChild<QMenu *>(menues[i].first);
-        QVERIFY2(m, qPrintable(menues[i].first));
-        QCOMPARE(oben[i], m->menuAction());
-        QCOMPARE(m->title(), menues[i].second);
-    }
-
-    // Items in order, "-" for a separator; the flag is the start state.
-    struct Eintrag {
-        const char *name;
-        const char *text;
-        bool an;
-    };
-    const QList<QPair<QString, QList<Eintrag>>> baum = {
-        {"MnuDatei",
-         {{"MnuLaden", "Datei &öffnen ...", true},
-          {"MnuSpeichern", "&Speichern", false},
-          {"MnuSpeichernUnter", "Speichern &unter ...", false},
-          {"MnuSep0", "-", true},
-          {"MnuAdressenSpeichern", "A&dressliste als Text speichern", false},
-          {"MnuPlanSpeichern", "&Plan als Text speichern", false},
-          {"MnuSep1", "-", true},
-          {"MnuDrucken", "&Drucken ...", false},
-          {"MnuPdfSpeichern", "Als &PDF speichern ...", false},
-          {"MnuSep2", "-", true},
-          {"MnuProgrammBeenden", "Programm &beenden", true}}},
-        {"MnuBearbeiten", {{"MnuListe", "&Liste ...", true}, {"MnuTermine", "&Termine ...", true}}},
-        {"MnuAnsicht", {{"MnuPlanAnzeigen", "Plan &anzeigen", true}}},
-        {"MnuAusführen", {{"MnuPlanErstellen", "&Plan erstellen ...", true}}},
-        {"MnuOptionen", {{"MnuEinstellungen", "Einstellungen ...", true}}},
-        {"MnuHilfe",
-         {{"MnuInhalt", "I&nhalt - F1", true},
-          {"MnuHilfeZurHilfe", "Hilfe &zur Hilfe", true},
-          {"MnuSep3", "-", true},
-          {"MnuInfo", "&Info", true}}},
-    };
-    for (const auto &[menuName, eintraege] : baum) {
-        const QList<QAction *> ist = f->findChild<QMenu *>(menuName)->actions();
-        QCOMPARE(ist.size(), eintraege.size());
-        for (int i = 0; i < eintraege.size(); ++i) {
-            const Eintrag &e = eintraege[i];
-            QCOMPARE(ist[i]->objectName(), QString::fromUtf8(e.name));
-            if (QByteArray(e.text) == "-") {
-                QVERIFY(ist[i]->isSeparator());
-            } else {
-                QCOMPARE(ist[i]->text(), QString::fromUtf8(e.text));
-                QVERIFY2(ist[i]->isEnabled() == e.an, e.name);
-            }
-        }
-    }
-    QVERIFY(MenueAn(*f, "MnuDatei"));
-    QVERIFY(MenueAn(*f, "MnuBearbeiten"));
-    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
-    QVERIFY(!MenueAn(*f, "MnuAusführen"));
-    QVERIFY(MenueAn(*f, "MnuOptionen"));
-    QVERIFY(MenueAn(*f, "MnuHilfe"));
-
-    for (const char *rahmen : {"FrameMinis", "FrameGodi", "FramePlan"})
-        QVERIFY2(!f->findChild<QWidget *>(rahmen)->isVisible(), rahmen);
-}
-
-void TestFormMinis::werkzeugleisteImStartzustand()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Dis"));
-    QCOMPARE(SichtbaresBild(*f, "Print"), QString("Dis"));
-    QCOMPARE(SichtbaresBild(*f, "Search"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Dis"));
-    QCOMPARE(SichtbaresBild(*f, "Help"), QString("Up"));
-    QVERIFY(!f->findChild<QWidget *>("ImHelpDis"));
-
-    const QList<QPair<QString, QString>> tipps = {{"ImOpenUp", "Öffnen"},       {"ImSaveUp", "Speichern"},
-                                                  {"ImPrintUp", "Drucken"},     {"ImSearchUp", "Einstellungen"},
-                                                  {"ImNewUp", "Plan anzeigen"}, {"ImHelpUp", "Hilfe"}};
-    for (const auto &[bild, tipp] : tipps)
-        QCOMPARE(f->findChild<QWidget *>(bild)->toolTip(), tipp);
-
-    // The buttons sit left to right in the order of the design, the clock to their right.
-    int links = -1;
-    for (const char *bild : {"ImOpenUp", "ImSaveDis", "ImPrintDis", "ImSearchUp", "ImNewDis", "ImHelpUp"}) {
-        auto *w = f->findChild<QWidget *>(bild);
-        const int x = w->mapTo(f.get(), QPoint(0, 0)).x();
-        QVERIFY2(x > links, bild);
-        links = x;
-    }
-    QVERIFY(f->findChild<QWidget *>("PanelDatum")->mapTo(f.get(), QPoint(0, 0)).x() > links);
-}
-
-void TestFormMinis::bilderSind24x22UndUnterscheidenSich()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    for (const char *knopf : {"Open", "Save", "Print", "Search", "New", "Help"}) {
-        QList<QImage> bilder;
-        for (const char *zustand : {"Up", "Down", "Dis"}) {
-            auto *l = f->findChild<QLabel *>(QStringLiteral("Im%1%2").arg(knopf, zustand));
-            if (!l)
-                continue;
-            const QImage bild = l->pixmap().toImage();
-            QCOMPARE(bild.size(), QSize(24, 22));
-            QCOMPARE(l->size(), QSize(24, 22));
-            bilder << bild;
-        }
-        QVERIFY(bilder.size() >= 2);
-        for (int i = 0; i < bilder.size(); ++i)
-            for (int j = i + 1; j < bilder.size(); ++j)
-                QVERIFY2(bilder[i] != bilder[j], knopf);
-        // Raised border in Up (white top left), sunken in Down (black top left).
-        QCOMPARE(bilder[0].pixelColor(0, 0), QColor(Qt::white));
-        QCOMPARE(bilder[1].pixelColor(0, 0), QColor(Qt::black));
-    }
-}
-
-void TestFormMinis::nurDasUpBildReagiert()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    // Greyed Save, Print and New: a click does nothing.
-    for (const char *bild : {"ImSaveDis", "ImPrintDis", "ImNewDis"})
-        QTest::mouseClick(f->findChild<QWidget *>(bild), Qt::LeftButton);
-    QVERIFY(f->isEnabled());
-    QVERIFY(t.meldungen.gezeigt().empty());
-
-    QTest::mouseClick(f->findChild<QWidget *>("ImOpenUp"), Qt::LeftButton);
-    auto *browser = OffenesFenster<FormFileBrw>();
-    QVERIFY(browser);
-    QCOMPARE(browser->windowTitle(), QString("Datei öffnen"));
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Down"));
-    // The pressed image does not open a second browser.
-    QTest::mouseClick(f->findChild<QWidget *>("ImOpenDown"), Qt::LeftButton);
-    int offen = 0;
-    for (QWidget *w : QApplication::topLevelWidgets())
-        offen += qobject_cast<FormFileBrw *>(w) && w->isVisible();
-    QCOMPARE(offen, 1);
-    browser->close();
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Up"));
-}
-
-void TestFormMinis::titelUndUhr()
+// Menus with captions ("~": starts disabled), toolbar images (only Up reacts), title and clock.
+void TestFormMinis::startzustand()
 {
     Testumgebung t;
     t.uhr.setze(QDateTime(QDate(2027, 3, 4), QTime(5, 6, 7)));
     auto f = NeuesHauptfenster(t);
+    const QStringList baum = {"&Datei: Datei &öffnen ... | ~&Speichern | ~Speichern &unter ... | - | "
+                              "~A&dressliste als Text speichern | ~&Plan als Text speichern | - | ~&Drucken ... | "
+                              "~Als &PDF speichern ... | - | Programm &beenden",
+                              "&Bearbeiten: &Liste ... | &Termine ...", "~An&sicht: Plan &anzeigen",
+                              "~&Ausführen: &Plan erstellen ...", "&Optionen: Einstellungen ...",
+                              "&Hilfe: I&nhalt - F1 | Hilfe &zur Hilfe | - | &Info"};
+    QStringList ist;
+    for (QAction *m : f->menuBar()->actions()) {
+        QStringList eintraege;
+        for (QAction *a : m->menu()->actions())
+            eintraege << (a->isSeparator() ? "-" : (a->isEnabled() ? "" : "~") + a->text());
+        ist << (m->isEnabled() ? "" : "~") + m->text() + ": " + eintraege.join(" | ");
+    }
+    QCOMPARE(ist, baum);
+    QCOMPARE(Zustand(*f), ZustandStart);
+
+    for (const char *bild : {"ImSaveDis", "ImPrintDis", "ImNewDis", "ImOpenUp", "ImOpenDown"})
+        QTest::mouseClick(f->findChild<QWidget *>(bild), Qt::LeftButton);
+    const auto fenster = QApplication::topLevelWidgets();   // the main window and one browser
+    QVERIFY(std::count_if(fenster.begin(), fenster.end(), [](QWidget *w) { return w->isVisible(); }) == 2);
+    QVERIFY(OffenesFenster<FormFileBrw>() && t.meldungen.gezeigt().empty());
+
     QCOMPARE(f->windowTitle(), "Ministrantenplan - " + f->Daten().Dateiname.toUpper());
-    auto *panel = f->findChild<QLabel *>("PanelDatum");
-    QCOMPARE(panel->text(), QString("04.03.2027 05:06:07"));
-    QVERIFY(panel->width() >= panel->fontMetrics().horizontalAdvance(panel->text()));
-    auto *timer = f->findChild<QTimer *>("TimerDatum");
-    QVERIFY(timer && timer->isActive());
-    QCOMPARE(timer->interval(), 1000);
+    auto *uhr = f->findChild<QLabel *>("PanelDatum");
+    QCOMPARE(uhr->text(), QString("04.03.2027 05:06:07"));
     t.uhr.setze(QDateTime(QDate(2027, 12, 31), QTime(23, 59, 58)));
-    QTRY_COMPARE_WITH_TIMEOUT(panel->text(), QString("31.12.2027 23:59:58"), 3000);
+    QTRY_COMPARE_WITH_TIMEOUT(uhr->text(), QString("31.12.2027 23:59:58"), 3000);
 }
 
 void TestFormMinis::bearbeitungszustandUndZurueck()
 {
     Testumgebung t;
     auto f = NeuesHauptfenster(t);
-    QVERIFY(Waehle(*f, "MnuListe"));
-    QVERIFY(f->findChild<QWidget *>("FrameMinis")->isVisible());
-    for (const char *menue : {"MnuDatei", "MnuBearbeiten", "MnuAnsicht", "MnuAusführen", "MnuOptionen"})
-        QVERIFY2(!MenueAn(*f, menue), menue);
-    QVERIFY(MenueAn(*f, "MnuHilfe"));
-    for (const char *eintrag : {"MnuInhalt", "MnuHilfeZurHilfe", "MnuInfo"})
-        QVERIFY2(Erreichbar(*f, eintrag), eintrag);
-    for (const char *knopf : {"Open", "Save", "Print", "Search", "New"})
-        QCOMPARE(SichtbaresBild(*f, knopf), QString("Dis"));
-    QCOMPARE(SichtbaresBild(*f, "Help"), QString("Up"));
-    // No second frame can be opened.
-    QVERIFY(!Waehle(*f, "MnuTermine"));
-    QVERIFY(!Waehle(*f, "MnuPlanErstellen"));
-
-    // Cancel with an empty roster: only the always-on parts come back.
-    QTest::mouseClick(f->findChild<QPushButton *>("BtnAbbruch"), Qt::LeftButton);
-    QVERIFY(!f->findChild<QWidget *>("FrameMinis")->isVisible());
-    QVERIFY(MenueAn(*f, "MnuDatei") && MenueAn(*f, "MnuBearbeiten") && MenueAn(*f, "MnuOptionen"));
-    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
-    QVERIFY(!MenueAn(*f, "MnuAusführen"));
-    for (const char *eintrag : {"MnuSpeichern", "MnuSpeichernUnter", "MnuAdressenSpeichern", "MnuPlanSpeichern",
-                                "MnuDrucken", "MnuPdfSpeichern"})
-        QVERIFY2(!Erreichbar(*f, eintrag), eintrag);
-    QCOMPARE(SichtbaresBild(*f, "Open"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "Search"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Dis"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Dis"));
-
-    // The services page and the plan panel go the same way.
-    QVERIFY(Waehle(*f, "MnuTermine"));
-    QVERIFY(f->findChild<QWidget *>("FrameGodi")->isVisible());
-    QVERIFY(!MenueAn(*f, "MnuDatei"));
+    f->Daten() = Beispieldaten({"Abel"});   // "Plan erstellen" needs servers
     f->MenueAktivieren();
-    f->findChild<QWidget *>("FrameGodi")->hide();
-    f->Daten().AnzahlMinis = 1;
-    f->MenueAktivieren();
-    QVERIFY(Waehle(*f, "MnuPlanErstellen"));
-    QVERIFY(f->findChild<QWidget *>("FramePlan")->isVisible());
-    QVERIFY(!MenueAn(*f, "MnuAusführen"));
-    QTest::mouseClick(f->findChild<QPushButton *>("BtnAbbruch3"), Qt::LeftButton);
-    QVERIFY(!f->findChild<QWidget *>("FramePlan")->isVisible());
-    QVERIFY(MenueAn(*f, "MnuAusführen"));
-    QVERIFY(Erreichbar(*f, "MnuSpeichern"));
-}
-
-void TestFormMinis::menueAktivierenSchaltetNurEin()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    f->Daten().AnzahlMinis = 2;
-    f->Daten().AnzahlPlanEintraege = 3;
-    f->MenueAktivieren();
-    QVERIFY(Erreichbar(*f, "MnuSpeichern"));
-    QVERIFY(MenueAn(*f, "MnuAnsicht"));
-    // The conditions no longer hold, but MenueAktivieren never disables.
-    f->Daten().AnzahlMinis = 0;
-    f->Daten().AnzahlPlanEintraege = 0;
-    f->MenueAktivieren();
-    QVERIFY(Erreichbar(*f, "MnuSpeichern"));
-    QVERIFY(MenueAn(*f, "MnuAnsicht"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Up"));
-    // Through the editing state the groups fall back to their conditions.
-    f->MenueDeaktivieren();
-    f->MenueAktivieren();
-    QVERIFY(!Erreichbar(*f, "MnuSpeichern"));
-    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Dis"));
-}
-
-void TestFormMinis::menueAktivierenMitMinisUndPlan()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    f->Daten().AnzahlMinis = 1;
-    f->MenueDeaktivieren();
-    f->MenueAktivieren();
-    for (const char *eintrag : {"MnuSpeichern", "MnuSpeichernUnter", "MnuAdressenSpeichern", "MnuPlanSpeichern",
-                                "MnuDrucken", "MnuPdfSpeichern", "MnuPlanErstellen"})
-        QVERIFY2(Erreichbar(*f, eintrag), eintrag);
-    QCOMPARE(SichtbaresBild(*f, "Save"), QString("Up"));
-    QCOMPARE(SichtbaresBild(*f, "Print"), QString("Up"));
-    // The plan group waits for a plan.
-    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Dis"));
+    for (const QString seite : {"Liste:FrameMinis:BtnAbbruch", "Termine:FrameGodi:BtnAbbruch2",
+                                "PlanErstellen:FramePlan:BtnAbbruch3"}) {
+        auto *rahmen = f->findChild<QWidget *>(seite.section(':', 1, 1));
+        QVERIFY(Waehle(*f, "Mnu" + seite.section(':', 0, 0)) && rahmen->isVisible());
+        QCOMPARE(Zustand(*f), ZustandBearbeitung);
+        QTest::mouseClick(f->findChild<QPushButton *>(seite.section(':', 2)), Qt::LeftButton);
+        QVERIFY(!rahmen->isVisible());
+        QCOMPARE(Zustand(*f), ZustandMitMinis);
+    }
     f->Daten().AnzahlPlanEintraege = 1;
     f->MenueAktivieren();
-    QVERIFY(Erreichbar(*f, "MnuPlanAnzeigen"));
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Up"));
+    QCOMPARE(Zustand(*f), ZustandMitPlan);
+    // MenueAktivieren only enables; through the editing state the groups follow their conditions.
+    f->Daten().AnzahlMinis = f->Daten().AnzahlPlanEintraege = 0;
+    f->MenueAktivieren();
+    QCOMPARE(Zustand(*f), ZustandMitPlan);
+    f->MenueDeaktivieren();
+    f->MenueAktivieren();
+    QCOMPARE(Zustand(*f), ZustandStart);
 }
 
-void TestFormMinis::tastenkuerzelNurBeiErreichbaremEintrag()
+// Strg+S, Strg+O and Strg+Q act only while their item is reachable. Help is reachable by menu,
+// toolbar and F1 always, also in the editing state and from a secondary window.
+void TestFormMinis::tastenUndHilfe()
 {
     Testumgebung t;
     auto f = NeuesHauptfenster(t);
-    QCOMPARE(Aktion(*f, "MnuLaden")->shortcut(), QKeySequence("Ctrl+O"));
-    QCOMPARE(Aktion(*f, "MnuSpeichern")->shortcut(), QKeySequence("Ctrl+S"));
-    QCOMPARE(Aktion(*f, "MnuDrucken")->shortcut(), QKeySequence("Ctrl+P"));
-    QCOMPARE(Aktion(*f, "MnuProgrammBeenden")->shortcut(), QKeySequence("Ctrl+Q"));
-
-    // In the editing state "Datei öffnen" is under a disabled menu: Strg+O does nothing.
-    f->MenueDeaktivieren();
-    QTest::keyClick(f.get(), Qt::Key_O, Qt::ControlModifier);
-    QVERIFY(!OffenesFenster<FormFileBrw>());
-    QTest::keyClick(f.get(), Qt::Key_Q, Qt::ControlModifier);
-    QVERIFY(t.meldungen.gezeigt().empty());
-    f->MenueAktivieren();
-
-    // Strg+S with the item disabled writes nothing even with changes.
-    f->Daten().Geaendert = true;
-    f->Daten().Dateiname = t.pfad("kurz.prd");
-    QTest::keyClick(f.get(), Qt::Key_S, Qt::ControlModifier);
-    QVERIFY(!QFile::exists(t.pfad("kurz.prd")));
-
     f->Daten() = Beispieldaten({"Abel"});
-    f->Daten().Geaendert = true;
     f->Daten().Dateiname = t.pfad("kurz.prd");
+    f->Daten().Geaendert = true;
+    QTest::keyClick(f.get(), Qt::Key_S, Qt::ControlModifier);
+    f->MenueDeaktivieren();
+    QTest::keyClick(f.get(), Qt::Key_O, Qt::ControlModifier);
+    QTest::keyClick(f.get(), Qt::Key_Q, Qt::ControlModifier);
+    QVERIFY(!QFile::exists(t.pfad("kurz.prd")) && !OffenesFenster<FormFileBrw>() && t.meldungen.gezeigt().empty());
+    QVERIFY(Waehle(*f, "MnuInhalt") && Waehle(*f, "MnuHilfeZurHilfe"));
+    QTest::mouseClick(f->findChild<QWidget *>("ImHelpUp"), Qt::LeftButton);
+    QTest::keyClick(f.get(), Qt::Key_F1);
     f->MenueAktivieren();
     QTest::keyClick(f.get(), Qt::Key_S, Qt::ControlModifier);
-    QVERIFY(QFile::exists(t.pfad("kurz.prd")));
-
-    t.meldungen.antworte(Antwort::Abbrechen);
-    f->Daten().Geaendert = true;
+    t.meldungen.antworte(Antwort::Nein);
     QTest::keyClick(f.get(), Qt::Key_Q, Qt::ControlModifier);
-    QCOMPARE(t.meldungen.titel(), QStringList{"Programm beenden"});
-    QVERIFY(f->isVisible());
-
+    QCOMPARE(t.meldungen.texte(), QStringList{"Soll das Programm beendet werden?"});
     QTest::keyClick(f.get(), Qt::Key_O, Qt::ControlModifier);
-    auto *browser = OffenesFenster<FormFileBrw>();
-    QVERIFY(browser);
-    browser->close();
+    QTest::keyClick(OffenesFenster<FormFileBrw>(), Qt::Key_F1);
+    QVERIFY(QFile::exists(t.pfad("kurz.prd")) && t.hilfe.inhalt == 4 && t.hilfe.hilfeZurHilfe == 1);
 }
 
-void TestFormMinis::hilfeEinstiegspunkte()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QVERIFY(Waehle(*f, "MnuInhalt"));
-    QCOMPARE(t.hilfe.inhalt, 1);
-    QVERIFY(Waehle(*f, "MnuHilfeZurHilfe"));
-    QCOMPARE(t.hilfe.hilfeZurHilfe, 1);
-    QTest::mouseClick(f->findChild<QWidget *>("ImHelpUp"), Qt::LeftButton);
-    QCOMPARE(t.hilfe.inhalt, 2);
-    QTest::keyClick(f.get(), Qt::Key_F1);
-    QCOMPARE(t.hilfe.inhalt, 3);
-
-    // In the editing state help stays reachable.
-    f->MenueDeaktivieren();
-    QVERIFY(Waehle(*f, "MnuInhalt"));
-    QTest::mouseClick(f->findChild<QWidget *>("ImHelpUp"), Qt::LeftButton);
-    QCOMPARE(t.hilfe.inhalt, 5);
-    f->MenueAktivieren();
-
-    // F1 also from a secondary window, while the main window is disabled.
-    f->Einstellungen();
-    auto *einstellungen = OffenesFenster<FormEinstellungen>();
-    QVERIFY(einstellungen);
-    QVERIFY(!f->isEnabled());
-    QTest::keyClick(einstellungen->focusWidget() ? einstellungen->focusWidget() : einstellungen, Qt::Key_F1);
-    QCOMPARE(t.hilfe.inhalt, 6);
-    QVERIFY(einstellungen->isVisible());
-    einstellungen->close();
-}
-
-void TestFormMinis::infoSperrtHauptfensterBisOK()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    QVERIFY(Waehle(*f, "MnuInfo"));
-    auto *info = OffenesFenster<FormInfo>();
-    QVERIFY(info);
-    QVERIFY(!f->isEnabled());
-    QVERIFY(info->isEnabled());
-    // The help file is named only at program start, not again from the menu.
-    QVERIFY(t.hilfe.datei().isEmpty());
-    // The disabled main window takes no input.
-    QTest::keyClick(f.get(), Qt::Key_O, Qt::ControlModifier);
-    QVERIFY(!OffenesFenster<FormFileBrw>());
-    QTest::mouseClick(info->findChild<QPushButton *>("CmdOK"), Qt::LeftButton);
-    QVERIFY(!info->isVisible());
-    QVERIFY(f->isEnabled());
-    Aufraeumen();
-    QVERIFY(!OffenesFenster<FormInfo>());
-
-    // Escape and the close box close it the same way.
-    QVERIFY(Waehle(*f, "MnuInfo"));
-    info = OffenesFenster<FormInfo>();
-    QTest::keyClick(info, Qt::Key_Escape);
-    QVERIFY(f->isEnabled());
-    QVERIFY(Waehle(*f, "MnuInfo"));
-    OffenesFenster<FormInfo>()->close();
-    QVERIFY(f->isEnabled());
-}
-
-void TestFormMinis::sekundaerfensterBleibtBedienbarUndJedesSchliessenStelltHer()
-{
-    Testumgebung t;
-    auto f = NeuesHauptfenster(t);
-    // Enabling the main window again must not enable the menus that were off.
-    f->Einstellungen();
-    OffenesFenster<FormEinstellungen>()->close();
-    QVERIFY(!MenueAn(*f, "MnuAnsicht"));
-    QVERIFY(!MenueAn(*f, "MnuAusführen"));
-    QVERIFY(MenueAn(*f, "MnuDatei"));
-
-    f->Daten().AnzahlMinis = 1;
-    f->Daten().AnzahlPlanEintraege = 1;
-    f->MenueAktivieren();
-
-    // close box
-    QVERIFY(Waehle(*f, "MnuEinstellungen"));
-    auto *einstellungen = OffenesFenster<FormEinstellungen>();
-    QVERIFY(einstellungen && einstellungen->isEnabled());
-    QVERIFY(!einstellungen->parentWidget());
-    QVERIFY(!f->isEnabled());
-    QCOMPARE(SichtbaresBild(*f, "Search"), QString("Down"));
-    QPointer<QWidget> weg = einstellungen;
-    einstellungen->close();
-    QVERIFY(f->isEnabled());
-    QCOMPARE(SichtbaresBild(*f, "Search"), QString("Up"));
-    Aufraeumen();
-    QVERIFY(weg.isNull());
-
-    // Escape
-    QTest::mouseClick(f->findChild<QWidget *>("ImSearchUp"), Qt::LeftButton);
-    einstellungen = OffenesFenster<FormEinstellungen>();
-    QVERIFY(einstellungen);
-    weg = einstellungen;
-    QTest::keyClick(einstellungen, Qt::Key_Escape);
-    QVERIFY(f->isEnabled());
-    QCOMPARE(SichtbaresBild(*f, "Search"), QString("Up"));
-    Aufraeumen();
-    QVERIFY(weg.isNull());
-
-    // The browser restores the title and resets its flag when it closes.
-    f->Daten().Dateiname = t.pfad("neu.prd");
-    QVERIFY(Waehle(*f, "MnuLaden"));
-    QVERIFY(f->Daten().DateiLaden);
-    auto *browser = OffenesFenster<FormFileBrw>();
-    QTest::mouseClick(browser->findChild<QPushButton *>("CmdAbbruch"), Qt::LeftButton);
-    QVERIFY(!f->Daten().DateiLaden);
-    QCOMPARE(f->windowTitle(), "Ministrantenplan - " + t.pfad("neu.prd").toUpper());
-}
-
-void TestFormMinis::planAnzeigeDruecktNeuKnopf()
+// A secondary window disables the main window (close box included) but stays usable; every way of
+// closing it enables the main window, restores menus (also disabled ones) and image, and deletes it.
+void TestFormMinis::sekundaerfensterSperrenBisZumSchliessen()
 {
     Testumgebung t;
     auto f = NeuesHauptfenster(t);
     SchreibeBeispiel(t.pfad("plan.prd"), Beispieldaten({"Abel"}, 2));
-    f->Daten().Dateiname = t.pfad("plan.prd");
-    QVERIFY(f->Laden());
-    QVERIFY(Waehle(*f, "MnuPlanAnzeigen"));
-    auto *plan = OffenesFenster<FormPlan>();
-    QVERIFY(plan);
-    QVERIFY(plan->isEnabled());
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Down"));
-    QTest::keyClick(plan, Qt::Key_Escape);
-    QVERIFY(!plan->isVisible());
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Up"));
-    QVERIFY(f->isEnabled());
-
-    QTest::mouseClick(f->findChild<QWidget *>("ImNewUp"), Qt::LeftButton);
-    plan = OffenesFenster<FormPlan>();
-    QVERIFY(plan);
-    QTest::mouseClick(plan->findChild<QPushButton *>("BtnOK"), Qt::LeftButton);
-    QCOMPARE(SichtbaresBild(*f, "New"), QString("Up"));
-    QVERIFY(f->isEnabled());
+    for (const QString fenster : {"Einstellungen:Search:BtnAbbruchEinstellungen", "Info:Help:CmdOK",
+                                  "PlanAnzeigen:New:BtnOK"}) {
+        const QString knopf = fenster.section(':', 1, 1);
+        if (knopf == "New")
+            f->Daten().Dateiname = t.pfad("plan.prd");
+        QVERIFY(knopf != "New" || f->Laden());
+        for (int weg = 0; weg < 3; ++weg) {
+            const QString vorher = Zustand(*f);
+            QVERIFY(Waehle(*f, "Mnu" + fenster.section(':', 0, 0)));
+            QPointer<QWidget> w;
+            for (QWidget *k : QApplication::topLevelWidgets())
+                w = k != f.get() && k->isVisible() ? k : w.data();
+            QVERIFY(w && w->isEnabled() && !w->parentWidget() && !f->isEnabled());
+            QCOMPARE(SichtbaresBild(*f, knopf), QString(knopf == "Help" ? "Up" : "Down"));
+            QTest::keyClick(f.get(), Qt::Key_O, Qt::ControlModifier);
+            QVERIFY(!f->close() && !OffenesFenster<FormFileBrw>() && t.meldungen.gezeigt().empty());
+            if (weg == 0)
+                QTest::mouseClick(w->findChild<QPushButton *>(fenster.section(':', 2)), Qt::LeftButton);
+            else
+                weg == 1 ? QTest::keyClick(w, Qt::Key_Escape) : void(w->close());
+            QCOMPARE(Zustand(*f), vorher);
+            Aufraeumen();
+            QVERIFY(w.isNull() && f->isEnabled());
+        }
+    }
 }
 
-void TestFormMinis::textexporteSchreibenNebenDieDatei()
+// The info window at start names the help file and shows the main window; the help's own window.
+void TestFormMinis::infoUndHilfefenster()
+{
+    Testumgebung t;
+    FormMinis haupt(t.umgebung());
+    auto *info = new FormInfo(haupt, t.hilfe, t.ordner.path() + "/");
+    QVERIFY(t.hilfe.datei() == t.ordner.path() + "/pradilon.hlp" && haupt.isVisible() && haupt.isEnabled());
+    info->show();
+    QTest::mouseClick(info->findChild<QPushButton *>("CmdOK"), Qt::LeftButton);
+    QVERIFY(!info->isVisible() && haupt.isEnabled());
+
+    HilfeFenster hilfe;
+    hilfe.setzeDatei(PRADILON_QUELLEN "/help/pradilon.hlp");
+    hilfe.ZeigeHilfeZurHilfe();
+    QVERIFY(hilfe.fenster()->isVisible() && !hilfe.fenster()->parentWidget());
+    QCOMPARE(hilfe.browser()->source().fragment(), QString("hilfe-zur-hilfe"));
+    hilfe.ZeigeInhalt();
+    QCOMPARE(hilfe.browser()->source().fragment(), QString("inhalt"));
+}
+
+// The real box. Per row: buttons, icon, button pressed ("": Escape), buttons seen, Qt's icon, answer.
+void TestFormMinis::meldungenMitDeutschenKnoepfen()
+{
+    const QList<std::tuple<Knoepfe, Symbol, QString, QString, QMessageBox::Icon, Antwort>> faelle = {
+        {Knoepfe::OK, Symbol::Kritisch, "OK", "OK", QMessageBox::Critical, Antwort::OK},
+        {Knoepfe::OKAbbrechen, Symbol::Ausrufezeichen, "", "Abbrechen OK", QMessageBox::Warning, Antwort::Abbrechen},
+        {Knoepfe::JaNeinAbbrechen, Symbol::Keins, "Nein", "Abbrechen Ja Nein", QMessageBox::NoIcon, Antwort::Nein},
+        {Knoepfe::JaNein, Symbol::Information, "Ja", "Ja Nein", QMessageBox::Information, Antwort::Ja}};
+    for (const auto &[knoepfe, symbol, druecke, gesehen, qtSymbol, antwort] : faelle) {
+        QStringList ist;
+        QTimer::singleShot(0, [&ist, taste = druecke] {
+            auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
+            for (QAbstractButton *b : box->buttons())
+                ist << b->text();
+            ist.sort();
+            ist << box->windowTitle() + "|" + box->text() + "|" + QString::number(box->icon());
+            for (QAbstractButton *b : box->buttons())
+                if (b->text() == taste)
+                    return b->click();
+            QTest::keyClick(box, Qt::Key_Escape);
+        });
+        QCOMPARE(QtMeldungen().zeige("Text", knoepfe, symbol, "Titel"), antwort);
+        QCOMPARE(ist, gesehen.split(' ') << "Titel|Text|" + QString::number(qtSymbol));
+    }
+}
+
+// Arrows stop at 0 and 10, move values outside only towards the range. Typed values are checked on OK
+// or leaving the box: outside 0..10 (also beyond 16 bits) the message and 2 (-1 below), else rounded,
+// a leading number counts. OK marks the data changed even unchanged; Abbrechen and Escape keep it.
+void TestFormMinis::einstellungen()
 {
     Testumgebung t;
     auto f = NeuesHauptfenster(t);
-    SchreibeBeispiel(t.pfad("daten.prd"), Beispieldaten({"Abel", "Berg"}, 1));
-    f->Daten().Dateiname = t.pfad("daten.prd");
-    QVERIFY(f->Laden());
-    QVERIFY(Waehle(*f, "MnuPlanSpeichern"));
-    QVERIFY(QFile::exists(t.pfad("PLAN.TXT")));
-    QVERIFY(Waehle(*f, "MnuAdressenSpeichern"));
-    QVERIFY(QFile::exists(t.pfad("ADRESS.TXT")));
-    // The address list is dated with the program's clock.
-    QVERIFY(Dateizeilen(t.pfad("ADRESS.TXT")).join('\n').contains("05.12.2026"));
+    f->Daten().Intervall = 7;
+    f->Daten().Geschwister = false;
+    auto *e = Oeffne(*f);
+    QVERIFY(!e->findChild<QCheckBox *>("CheckGeschwister")->isChecked() && Text(e)->text() == "7");
+    const QList<std::tuple<QString, const char *, QString>> pfeile = {
+        {"2", "Hoch", "3"}, {"2", "Runter", "1"}, {"10", "Hoch", "10"}, {"0", "Runter", "0"}, {"15", "Hoch", "15"},
+        {"15", "Runter", "14"}, {"-3", "Runter", "-3"}, {"-3", "Hoch", "-2"}, {"6", "Hoch", "7"}};
+    for (const auto &[start, pfeil, ergebnis] : pfeile) {
+        Text(e)->setText(start);
+        Klicke(e, QByteArray("SpinBtnIntervall") + pfeil);
+        QCOMPARE(Text(e)->text(), ergebnis);
+    }
+    Klicke(e, "BtnOKEinstellungen");
+    QVERIFY(f->Daten().Geaendert && !f->Daten().Geschwister && f->Daten().Intervall == 7);
+
+    const QString warnung = "Den Abstand zwischen zwei Einteilungen >10 oder <0 zu wählen, macht keinen Sinn. "
+                            "Korrigiere auf Default-Wert 2.";
+    const QList<QPair<QString, int>> faelle = {{"11", -1}, {"-1", -1}, {"10.6", -1}, {"99999", -1}, {"-40000", -1},
+                                               {"1E300", -1}, {"10", 10}, {"0", 0}, {"3.7", 4}, {"2.5", 2},
+                                               {"abc", 0}, {"", 0}, {"6 Gottesdienste", 6}};
+    for (const auto &[eingabe, wert] : faelle) {
+        for (bool perTab : {false, true}) {
+            t.meldungen.leeren();
+            e = Oeffne(*f);
+            Tippe(e, eingabe);
+            if (perTab)
+                QTest::keyClick(Text(e), Qt::Key_Tab);
+            QCOMPARE(Text(e)->text(), perTab ? QString::number(wert < 0 ? 2 : wert) : eingabe);
+            Klicke(e, "BtnOKEinstellungen");
+            QCOMPARE(f->Daten().Intervall, int16_t(wert < 0 ? 2 : wert));
+            QCOMPARE(t.meldungen.titel() + t.meldungen.texte(),
+                     (wert < 0 ? QStringList{"Intervall zu groß", warnung} : QStringList()));
+        }
+    }
+
+    for (const char *weg : {"BtnAbbruchEinstellungen", "Escape", "BtnOKEinstellungen"}) {
+        f->Daten().Geaendert = false;
+        t.meldungen.leeren();
+        e = Oeffne(*f);
+        Klicke(e, "CheckGeschwister");
+        Tippe(e, "11");
+        const bool ok = weg[3] == 'O', escape = weg[0] == 'E';
+        escape ? QTest::keyClick(Text(e), Qt::Key_Escape) : Klicke(e, weg);
+        // Leaving the text box comes first, so OK and Abbrechen show its message.
+        QCOMPARE(t.meldungen.titel(), escape ? QStringList() : QStringList{"Intervall zu groß"});
+        QVERIFY(f->Daten().Intervall == (ok ? 2 : 6) && f->Daten().Geschwister == ok && f->Daten().Geaendert == ok);
+        QVERIFY(!e->isVisible() && f->isEnabled());
+    }
 }
 
 QTEST_MAIN(TestFormMinis)
