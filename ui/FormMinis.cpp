@@ -370,20 +370,19 @@ void FormMinis::DateiOeffnen()
 {
     m_daten.DateiLaden = true;
     knopf(Knopf::Open).setzeGedrueckt(true);
-    auto *browser = new FormFileBrw(m_daten, m_umgebung.meldungen,
-                                    DateiProzeduren{[this] { return Laden(); },
-                                                    [this](bool unter) { return Speichern(unter); }},
-                                    m_umgebung.programmOrdner);
-    ZeigeSekundaer(browser, std::nullopt, [this] {
-        knopf(Knopf::Open).setzeGedrueckt(false);
-        knopf(Knopf::Save).setzeGedrueckt(false);
-    });
-    browser->setWindowTitle(QStringLiteral("Datei öffnen"));
+    ZeigeDateibrowser(QStringLiteral("Datei öffnen"));
 }
 
 void FormMinis::SpeichernUnter()
 {
     m_daten.DateiSpeichernUnter = true;
+    ZeigeDateibrowser(QStringLiteral("Datei speichern unter"));
+    knopf(Knopf::Save).setzeGedrueckt(true);
+}
+
+// The browser acts on DateiLaden / DateiSpeichernUnter when its OK is clicked.
+void FormMinis::ZeigeDateibrowser(const QString &titel)
+{
     auto *browser = new FormFileBrw(m_daten, m_umgebung.meldungen,
                                     DateiProzeduren{[this] { return Laden(); },
                                                     [this](bool unter) { return Speichern(unter); }},
@@ -392,8 +391,7 @@ void FormMinis::SpeichernUnter()
         knopf(Knopf::Open).setzeGedrueckt(false);
         knopf(Knopf::Save).setzeGedrueckt(false);
     });
-    browser->setWindowTitle(QStringLiteral("Datei speichern unter"));
-    knopf(Knopf::Save).setzeGedrueckt(true);
+    browser->setWindowTitle(titel);
 }
 
 bool FormMinis::BeendenBestaetigt()

@@ -45,6 +45,7 @@ public:
 
     void DateiOeffnen();
     void SpeichernUnter();
+    void ZeigeDateibrowser(const QString &titel);
     void ProgrammBeenden();
     void Einstellungen();
     void AnzeigePlan();
