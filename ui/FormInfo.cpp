@@ -103,8 +103,8 @@ void FormInfo::FormUnload()
         return;
     m_entladen = true;
     m_cmdOK->setEnabled(false);
-    if (m_haupt) {
+    // Enabling the main window is left to whoever disabled it: the info window of the start
+    // disabled nothing and may close while another secondary window keeps the main window off.
+    if (m_haupt)
         m_haupt->show();
-        m_haupt->setEnabled(true);
-    }
 }

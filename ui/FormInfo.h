@@ -7,8 +7,8 @@ class Hilfe;
 class QPushButton;
 
 // The start-up window and the window of "&Info". At program start (main window not yet
-// visible) it names the help file and shows the main window; closing it, whichever way,
-// enables the main window.
+// visible) it names the help file and shows the main window. From the menu it is shown as a
+// secondary window, which enables the main window again when it closes.
 class FormInfo : public QDialog
 {
     Q_OBJECT

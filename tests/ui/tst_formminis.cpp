@@ -174,8 +174,12 @@ void TestFormMinis::infoUndHilfefenster()
     auto *info = new FormInfo(haupt, t.hilfe, t.ordner.path() + "/");
     QVERIFY(t.hilfe.datei() == t.ordner.path() + "/pradilon.hlp" && haupt.isVisible() && haupt.isEnabled());
     info->show();
+    // Closed while the settings are open, it leaves the main window to them.
+    haupt.Einstellungen();
     QTest::mouseClick(info->findChild<QPushButton *>("CmdOK"), Qt::LeftButton);
-    QVERIFY(!info->isVisible() && haupt.isEnabled());
+    QVERIFY(!info->isVisible() && !haupt.isEnabled());
+    OffenesFenster<FormEinstellungen>()->close();
+    QVERIFY(haupt.isEnabled());
 
     HilfeFenster hilfe;
     hilfe.setzeDatei(PRADILON_QUELLEN "/help/pradilon.hlp");
