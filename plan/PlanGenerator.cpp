@@ -316,7 +316,8 @@ void PlanGenerator::berechneTagesZustand()
         bereiteMinisVor();
     const qint64 tag = AktDatum.toJulianDay();
     // The days of a computation only grow, so each server's cursor into its sorted ranges only
-    // moves forward; a step back (calls from outside a computation) starts the cursors afresh.
+    // moves forward. Calls from outside a computation rebuild everything anyway; this guards
+    // against AktDatum being set back while a computation keeps its caches.
     if (tag < m_zeigerTag)
         std::copy(m_spanneAb.begin(), m_spanneAb.end() - 1, m_zeiger.begin());
     m_zeigerTag = tag;
