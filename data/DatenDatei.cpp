@@ -239,6 +239,10 @@ public:
 
     void text(const QString &t)
     {
+        // A line feed would end the line early and shift every later line of the file; a lone
+        // carriage return is read back as part of the text.
+        if (t.contains(u'\n'))
+            throw SchreibAbbruch{QStringLiteral("Zeilenumbruch im Text: ") + t};
         if (!KodiereCp1252(t, m_ziel))
             throw SchreibAbbruch{QStringLiteral("Zeichen außerhalb von Windows-1252: ") + t};
         zeilenende();

@@ -300,9 +300,13 @@ TEST_F(Sichern, NachDemFehlschlagBleibtDerNameNurUnterNeuemNamenNicht)
     }
 }
 
-TEST_F(Sichern, ZeichenAusserhalbDerCodeseiteLassenDieAlteDateiStehen)
+TEST_F(Sichern, ZeichenAusserhalbDerCodeseiteOderZeilenumbruchLassenDieAlteDateiStehen)
 {
     m_daten.Ausnahmen[0].Zeit[3] = QString::fromUtf8("10 Uhr ✝");
+    erwarteFehlschlag(Speichern(m_daten, m_meldungen, false));
+    // A line feed inside a text would shift every later line of the file.
+    m_meldungen.leeren();
+    m_daten.Ausnahmen[0].Zeit[3] = QStringLiteral("10\nUhr");
     erwarteFehlschlag(Speichern(m_daten, m_meldungen, false));
 }
 
