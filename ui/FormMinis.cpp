@@ -90,7 +90,7 @@ FormMinis::FormMinis(const Umgebung &umgebung, QWidget *parent)
     raster->setContentsMargins(8, 7, 8, 8);
     m_frameMinis = new FrameMinis(m_daten, m_umgebung.meldungen, *this, flaeche);
     m_frameGodi = new FrameGodi(m_daten, m_umgebung.meldungen, *this, flaeche);
-    m_framePlan = new FramePlan(m_daten, m_umgebung.meldungen, *this, m_generator, m_umgebung.uhr, flaeche);
+    m_framePlan = new FramePlan(m_umgebung.meldungen, *this, m_generator, m_umgebung.uhr, flaeche);
     m_frameMinis->setObjectName(QStringLiteral("FrameMinis"));
     m_frameGodi->setObjectName(QStringLiteral("FrameGodi"));
     m_framePlan->setObjectName(QStringLiteral("FramePlan"));

@@ -32,8 +32,6 @@ public:
     ~FormMinis() override;
 
     InitMini &Daten() { return m_daten; }
-    const Umgebung &umgebung() const { return m_umgebung; }
-    PlanGenerator &generator() { return m_generator; }
 
     void MenueAktivieren() override;
     void MenueDeaktivieren() override;

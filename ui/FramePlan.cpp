@@ -1,6 +1,5 @@
 #include "ui/FramePlan.h"
 
-#include "data/InitMini.h"
 #include "data/Meldungen.h"
 #include "data/Uhr.h"
 #include "plan/PlanGenerator.h"
@@ -12,12 +11,11 @@
 #include <QLineEdit>
 #include <QPushButton>
 
-FramePlan::FramePlan(InitMini &daten, Meldungen &meldungen, Hauptfenster &hauptfenster, PlanGenerator &generator,
-                     const Uhr &uhr, QWidget *parent)
+// The generator works on the shared data; the panel itself only passes the typed texts on.
+FramePlan::FramePlan(Meldungen &meldungen, Hauptfenster &hauptfenster, PlanGenerator &generator, const Uhr &uhr,
+                     QWidget *parent)
     : QGroupBox(parent), m_meldungen(meldungen), m_hauptfenster(hauptfenster), m_generator(generator), m_uhr(uhr)
 {
-    // The generator works on the same data; the panel itself only passes the typed texts on.
-    (void)daten;
     setObjectName(QStringLiteral("FramePlan"));
     setTitle(QStringLiteral("Plan erstellen"));
 

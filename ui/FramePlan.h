@@ -2,7 +2,6 @@
 
 #include <QGroupBox>
 
-struct InitMini;
 class Meldungen;
 class Hauptfenster;
 class PlanGenerator;
@@ -16,8 +15,8 @@ class FramePlan : public QGroupBox
 {
     Q_OBJECT
 public:
-    FramePlan(InitMini &daten, Meldungen &meldungen, Hauptfenster &hauptfenster, PlanGenerator &generator,
-              const Uhr &uhr, QWidget *parent = nullptr);
+    FramePlan(Meldungen &meldungen, Hauptfenster &hauptfenster, PlanGenerator &generator, const Uhr &uhr,
+              QWidget *parent = nullptr);
 
     // Menu "&Plan erstellen ...".
     void MnuPlanErstellen_Click();

@@ -31,12 +31,7 @@ public:
 
     void setzeVerfuegbar(bool verfuegbar);
     void setzeGedrueckt(bool gedrueckt);
-    bool verfuegbar() const { return m_verfuegbar; }
     bool gedrueckt() const { return m_gedrueckt; }
-
-    Bild *up() const { return m_up; }
-    Bild *down() const { return m_down; }
-    Bild *dis() const { return m_dis; }
 
 signals:
     void geklickt();
