@@ -105,8 +105,8 @@ std::optional<QString> FindeDatei(const QString &ordner, const QString &name)
         if (QFileInfo(dir.filePath(name)).isFile())
             return name;
     }
-    const QStringList treffer =
-        dir.entryList(QStringList{qtMuster(name)}, QDir::Files | QDir::Hidden | QDir::System, QDir::Name | QDir::IgnoreCase);
+    // Among the files the list shows: a pattern must not pick a hidden file the user cannot see.
+    const QStringList treffer = dir.entryList(QStringList{qtMuster(name)}, QDir::Files, QDir::Name | QDir::IgnoreCase);
     if (treffer.isEmpty())
         return std::nullopt;
     return treffer.front();

@@ -131,12 +131,12 @@ void TestDateibefehle::beenden()
     }
 }
 
-// With stand-ins for loading and saving: "*.*" lists every file (also one without an extension),
+// With stand-ins for loading and saving: "*.*" lists every file (also one without an extension, not a hidden one),
 // a drive that does not answer, names that cannot be saved under, and a root folder.
 void TestDateibefehle::browserLaufwerkMusterUndNamen()
 {
     Testumgebung t;
-    for (const char *name : {"a.prd", "B.PRD", "c.txt", "d"})
+    for (const char *name : {"a.prd", "B.PRD", "c.txt", "d", ".0.prd"})
         QVERIFY(QFile(t.pfad(name)).open(QIODevice::WriteOnly));
     InitMini d;
     d.DateiSpeichernUnter = true;
@@ -153,6 +153,7 @@ void TestDateibefehle::browserLaufwerkMusterUndNamen()
         return namen.sort(), namen;
     };
     QTRY_COMPARE(dateien(), (QStringList{"B.PRD", "a.prd"}));
+    QCOMPARE(FindeDatei(t.ordner.path(), "*.PRD").value_or(""), "a.prd");   // the first listed, never a hidden one
     b.findChild<QComboBox *>("CmbDateiFormat")->setCurrentIndex(1);
     QCOMPARE(b.findChild<QLineEdit *>("TxtDatei")->text(), QString("*.*"));
     QTRY_COMPARE(dateien(), (QStringList{"B.PRD", "a.prd", "c.txt", "d"}));
