@@ -460,6 +460,7 @@ void FrameMinis::BtnAlleTermineLoeschen_Click()
 void FrameMinis::BtnOK_Click()
 {
     InitMini &d = m_daten;
+    const size_t bisher = size_t(std::max<int>(d.AnzahlMinis, 0));
     d.AnzahlMinis = AnzahlKopie;
     if (AnzahlKopie >= 1) {
         LadeDaten();
@@ -467,6 +468,10 @@ void FrameMinis::BtnOK_Click()
         d.Minis.resize(groesse);
         d.Sperre.resize(groesse, 0);
         d.Einsaetze.resize(groesse, 0);
+        // A position that was not in use starts at 0: the spare element may still hold the
+        // counters of a server deleted earlier.
+        for (size_t i = bisher; i < groesse; ++i)
+            d.Sperre[i] = d.Einsaetze[i] = 0;
         for (int i = 0; i < AnzahlKopie; ++i)
             d.Minis[i] = MinisKopie[i];
         Sortiere(0, d.AnzahlMinis - 1);

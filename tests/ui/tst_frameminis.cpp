@@ -160,6 +160,21 @@ private slots:
         QCOMPARE(text("TxtName"), "C");
     }
 
+    // The counters belong to the roster position, not to the server: sorting does not move them,
+    // and an added position starts at 0 even where the spare held a deleted server's counters.
+    void okSortiertOhneDieZaehlerMitzunehmen()
+    {
+        oeffne({"Zander Zoe", "Abel Anton"});
+        d().Einsaetze = {5, 7, 9};
+        d().Sperre = {1, 2, 3};
+        klick("BtnHinzufügen");
+        tipp("TxtName", "Mitte");
+        klick("BtnOK");
+        QCOMPARE(d().Minis[0].Name + d().Minis[1].Name + d().Minis[2].Name, "AbelMitteZander");
+        QCOMPARE(d().Einsaetze, (std::vector<int16_t>{5, 7, 0, 0}));
+        QCOMPARE(d().Sperre, (std::vector<int16_t>{1, 2, 0, 0}));
+    }
+
     void sucheMitLetztemTreffer()
     {
         oeffne({"Meier Anna", "Meier Bernd", "Müller Carla", "Zoller Zita"});
