@@ -97,6 +97,22 @@ int Verwendungsfehler(const char *befehl, const QString &grund)
     return FalscherAufruf;
 }
 
+std::optional<Argumente> LeseAufruf(const char *befehl, const QStringList &roh,
+                                    std::initializer_list<const char *> optionenMitWert, int anzahl,
+                                    const char *erwartet)
+{
+    Argumente a(roh, optionenMitWert);
+    if (!a.gueltig()) {
+        Verwendungsfehler(befehl, a.fehler());
+        return std::nullopt;
+    }
+    if (a.positionen().size() != anzahl) {
+        Verwendungsfehler(befehl, QString::fromUtf8(befehl) + QStringLiteral(" erwartet ") + QString::fromUtf8(erwartet));
+        return std::nullopt;
+    }
+    return a;
+}
+
 bool LadeDatei(const QString &pfad, InitMini &d, Meldungen &meldungen)
 {
     d.AlterDateiname = d.Dateiname;

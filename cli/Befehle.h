@@ -74,5 +74,11 @@ void SchreibeFehler(const QString &text);    // standard error, UTF-8
 // Prints the reason and the command's synopsis to standard error; returns FalscherAufruf.
 int Verwendungsfehler(const char *befehl, const QString &grund);
 
+// The arguments of befehl when they parse and hold exactly `anzahl` positional ones (named by
+// erwartet); otherwise the usage error is printed and nothing is returned.
+std::optional<Argumente> LeseAufruf(const char *befehl, const QStringList &roh,
+                                    std::initializer_list<const char *> optionenMitWert, int anzahl,
+                                    const char *erwartet);
+
 // Loads pfad as the open command does (counters start at 0); false after the load message.
 bool LadeDatei(const QString &pfad, InitMini &d, Meldungen &meldungen);

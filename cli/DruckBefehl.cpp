@@ -52,25 +52,23 @@ int DruckBefehl(const QStringList &argumente)
     DruckEinstellungen einstellungen{QString(), QStringLiteral("12"), QStringLiteral("1"), true, true};
     einstellungen.adressliste = rest.removeAll(QStringLiteral("--no-addresses")) == 0;
     einstellungen.plan = rest.removeAll(QStringLiteral("--no-plan")) == 0;
-    const Argumente a(rest, {"--pdf", "--font", "--size", "--spacing"});
-    if (!a.gueltig())
-        return Verwendungsfehler("print", a.fehler());
-    if (a.positionen().size() != 1)
-        return Verwendungsfehler("print", QStringLiteral("print erwartet genau eine Datei"));
-    const auto pdf = a.option("--pdf");
+    const auto a = LeseAufruf("print", rest, {"--pdf", "--font", "--size", "--spacing"}, 1, "genau eine Datei");
+    if (!a)
+        return FalscherAufruf;
+    const auto pdf = a->option("--pdf");
     if (!pdf || pdf->isEmpty())
         return Verwendungsfehler("print", QStringLiteral("print braucht --pdf OUT"));
     if (!einstellungen.adressliste && !einstellungen.plan)
         return Verwendungsfehler("print", QStringLiteral("--no-addresses und --no-plan zusammen lassen nichts zu drucken"));
-    einstellungen.schriftgroesse = a.option("--size").value_or(einstellungen.schriftgroesse);
-    einstellungen.zeilenabstand = a.option("--spacing").value_or(einstellungen.zeilenabstand);
+    einstellungen.schriftgroesse = a->option("--size").value_or(einstellungen.schriftgroesse);
+    einstellungen.zeilenabstand = a->option("--spacing").value_or(einstellungen.zeilenabstand);
     // The dialog offers only 1 to 3; a spacing of 0 or less would print every line on one spot.
     if (!(ZahlWert(einstellungen.zeilenabstand) > 0))
         return Verwendungsfehler("print", QStringLiteral("--spacing erwartet eine Zahl größer als 0"));
 
     CliMeldungen meldungen;
     InitMini d;
-    if (!LadeDatei(a.positionen()[0], d, meldungen))
+    if (!LadeDatei(a->positionen()[0], d, meldungen))
         return NichtGeladen;
 
     auto drucker = QtDrucker::pdfDatei(*pdf);
@@ -79,7 +77,7 @@ int DruckBefehl(const QStringList &argumente)
         SchreibeFehler(QStringLiteral("pradilon-cli: keine Schriften installiert\n"));
         return NichtGeschrieben;
     }
-    einstellungen.schriftart = a.option("--font").value_or(drucker->schriftName(0));
+    einstellungen.schriftart = a->option("--font").value_or(drucker->schriftName(0));
 
     SystemUhr uhr;
     const DruckErgebnis ergebnis = Druckauftrag(*drucker, d, meldungen, uhr).fuehreAus(einstellungen);

@@ -13,13 +13,11 @@
 
 int PlanBefehl(const QStringList &argumente)
 {
-    const Argumente a(argumente, {"--seed", "-o"});
-    if (!a.gueltig())
-        return Verwendungsfehler("plan", a.fehler());
-    if (a.positionen().size() != 3)
-        return Verwendungsfehler("plan", QStringLiteral("plan erwartet FILE, START und END"));
+    const auto a = LeseAufruf("plan", argumente, {"--seed", "-o"}, 3, "FILE, START und END");
+    if (!a)
+        return FalscherAufruf;
     std::unique_ptr<StandardZufall> zufall = std::make_unique<StandardZufall>();
-    if (const auto seed = a.option("--seed")) {
+    if (const auto seed = a->option("--seed")) {
         bool ok = false;
         const uint startwert = seed->toUInt(&ok);
         if (!ok)
@@ -29,13 +27,13 @@ int PlanBefehl(const QStringList &argumente)
 
     CliMeldungen meldungen;
     InitMini d;
-    const QString datei = a.positionen()[0];
+    const QString datei = a->positionen()[0];
     if (!LadeDatei(datei, d, meldungen))
         return NichtGeladen;
 
     SystemUhr uhr;
     PlanGenerator generator(d, *zufall);
-    switch (generator.BtnErstellen_Click(a.positionen()[1], a.positionen()[2], meldungen, uhr)) {
+    switch (generator.BtnErstellen_Click(a->positionen()[1], a->positionen()[2], meldungen, uhr)) {
     case PlanGenerator::Ergebnis::Abgelehnt:
         return ZeitraumAbgelehnt;
     case PlanGenerator::Ergebnis::Fehler:
@@ -44,7 +42,7 @@ int PlanBefehl(const QStringList &argumente)
         break;
     }
 
-    const QString ziel = a.option("-o").value_or(datei);
+    const QString ziel = a->option("-o").value_or(datei);
     d.AlterDateiname = d.Dateiname;
     d.Dateiname = ziel;
     return Speichern(d, meldungen, ziel != datei) == SpeicherErgebnis::Gespeichert ? Erfolg : NichtGeschrieben;
@@ -70,34 +68,30 @@ int AusgangVon(ExportErgebnis ergebnis)
 
 int PlanTextBefehl(const QStringList &argumente)
 {
-    const Argumente a(argumente, {"-o"});
-    if (!a.gueltig())
-        return Verwendungsfehler("plan-text", a.fehler());
-    if (a.positionen().size() != 1)
-        return Verwendungsfehler("plan-text", QStringLiteral("plan-text erwartet genau eine Datei"));
+    const auto a = LeseAufruf("plan-text", argumente, {"-o"}, 1, "genau eine Datei");
+    if (!a)
+        return FalscherAufruf;
 
     CliMeldungen meldungen;
     InitMini d;
-    if (!LadeDatei(a.positionen()[0], d, meldungen))
+    if (!LadeDatei(a->positionen()[0], d, meldungen))
         return NichtGeladen;
-    const auto pfad = a.option("-o");
+    const auto pfad = a->option("-o");
     return AusgangVon(pfad ? PlanAlsTextSpeichern(d, meldungen, *pfad) : PlanAlsTextSpeichern(d, meldungen));
 }
 
 int AdressenTextBefehl(const QStringList &argumente)
 {
-    const Argumente a(argumente, {"-o"});
-    if (!a.gueltig())
-        return Verwendungsfehler("addresses-text", a.fehler());
-    if (a.positionen().size() != 1)
-        return Verwendungsfehler("addresses-text", QStringLiteral("addresses-text erwartet genau eine Datei"));
+    const auto a = LeseAufruf("addresses-text", argumente, {"-o"}, 1, "genau eine Datei");
+    if (!a)
+        return FalscherAufruf;
 
     CliMeldungen meldungen;
     InitMini d;
-    if (!LadeDatei(a.positionen()[0], d, meldungen))
+    if (!LadeDatei(a->positionen()[0], d, meldungen))
         return NichtGeladen;
     const QDate heute = SystemUhr().jetzt().date();
-    const auto pfad = a.option("-o");
+    const auto pfad = a->option("-o");
     return AusgangVon(pfad ? AdresslisteAlsTextSpeichern(d, meldungen, heute, *pfad)
                            : AdresslisteAlsTextSpeichern(d, meldungen, heute));
 }
